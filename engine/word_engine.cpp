@@ -1,0 +1,1 @@
+#include "quorle/word_engine.h"
