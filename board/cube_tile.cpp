@@ -1,0 +1,45 @@
+#include "board/cube_tile.h"
+
+#include <QMouseEvent>
+#include <QPainter>
+#include <QVariant>
+
+#include "board/tile_picture.h"
+
+CubeTile::CubeTile(QWidget* parent) : QWidget(parent) {
+    setAttribute(Qt::WA_OpaquePaintEvent);
+    setProperty("selected", false);
+}
+
+void CubeTile::draw(bool selected, const QString& letter) {
+    selected_ = selected;
+    letter_ = letter;
+    setProperty("selected", selected);
+    setAccessibleName(letter);
+    repaint();
+}
+
+// The screen's resolution and the palette may change under a tile, so both are
+// asked for at each painting; the picture itself is kept elsewhere.
+void CubeTile::paintEvent(QPaintEvent*) {
+    const QColor background = palette().color(QPalette::Window);
+    QPainter painter(this);
+    painter.fillRect(rect(), background);
+    painter.drawPixmap(0, 0, TilePicture(selected_, letter_, devicePixelRatioF(), background));
+}
+
+void CubeTile::mousePressEvent(QMouseEvent* event) {
+    if (event->button() == Qt::LeftButton) pressed_ = true;
+}
+
+void CubeTile::mouseReleaseEvent(QMouseEvent* event) {
+    if (event->button() != Qt::LeftButton || !pressed_) return;
+    pressed_ = false;
+    if (rect().contains(event->position().toPoint())) emit clicked();
+}
+
+void CubeTile::mouseDoubleClickEvent(QMouseEvent* event) {
+    if (event->button() != Qt::LeftButton) return;
+    pressed_ = false;
+    emit doubleClicked();
+}

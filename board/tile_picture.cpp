@@ -1,0 +1,123 @@
+#include "board/tile_picture.h"
+
+#include <QHash>
+#include <QImage>
+#include <QPainter>
+#include <QPainterPath>
+
+#include "platform/layout.h"
+
+namespace {
+
+// The artwork is drawn with hard edges at four times the resolution, combined
+// there bit by bit and scaled down smoothly: combining soft edges bit by bit
+// would leave a pale fringe.
+constexpr int Oversampling = 4;
+constexpr qreal Margin = 1;
+constexpr qreal CornerRadius = 17;
+constexpr qreal OutlineWidth = 3;
+constexpr qreal RingInset = 9;
+constexpr qreal RingWidth = 2.5;
+constexpr double LetterPoints = 48;
+
+const QColor OutlineColour(128, 128, 128);
+const QColor LetterColour(24, 12, 4);
+
+struct Look {
+    QColor face;
+    QColor shadow;
+    bool ring;  // tells a lit tile apart without its colour
+};
+
+const Look NormalLook{QColor(255, 128, 64), QColor(128, 64, 0), false};
+const Look SelectedLook{QColor(0, 255, 128), QColor(0, 128, 0), true};
+
+QImage Canvas(int size, QColor colour) {
+    QImage image(size, size, QImage::Format_RGB32);
+    image.fill(colour);
+    return image;
+}
+
+QPainterPath CubeShape(qreal inset) {
+    const qreal from = Margin + inset;
+    QPainterPath shape;
+    shape.addRoundedRect(QRectF(from, from, TileSize - 2 * from, TileSize - 2 * from),
+                         CornerRadius - inset, CornerRadius - inset);
+    return shape;
+}
+
+QImage OuterMask(int size) {
+    QImage mask = Canvas(size, Qt::black);
+    QPainter painter(&mask);
+    painter.scale(size / qreal(TileSize), size / qreal(TileSize));
+    painter.fillPath(CubeShape(0), Qt::white);
+    return mask;
+}
+
+QPainterPath TopLeftHalf() {
+    QPainterPath half;
+    half.addPolygon({QPointF(0, 0), QPointF(TileSize, 0), QPointF(0, TileSize)});
+    return half;
+}
+
+// The outline lies along the top and left, the shadow along the bottom and right.
+QImage LookPicture(int size, const Look& look) {
+    QImage picture = Canvas(size, Qt::white);
+    QPainter painter(&picture);
+    painter.scale(size / qreal(TileSize), size / qreal(TileSize));
+    painter.fillPath(CubeShape(0), look.shadow);
+    painter.setClipPath(TopLeftHalf());
+    painter.fillPath(CubeShape(0), OutlineColour);
+    painter.setClipping(false);
+    painter.fillPath(CubeShape(OutlineWidth), look.face);
+    if (look.ring) {
+        painter.fillPath(CubeShape(RingInset), look.shadow);
+        painter.fillPath(CubeShape(RingInset + RingWidth), look.face);
+    }
+    return picture;
+}
+
+void Combine(QImage& tile, const QImage& picture, QPainter::CompositionMode operation) {
+    QPainter painter(&tile);
+    painter.setCompositionMode(operation);
+    painter.drawImage(0, 0, picture);
+}
+
+QPixmap BlankTile(bool selected, qreal pixelRatio, QColor background) {
+    const int devicePixels = qRound(TileSize * pixelRatio);
+    const int size = devicePixels * Oversampling;
+    QImage tile = Canvas(size, background);
+    Combine(tile, OuterMask(size), QPainter::RasterOp_SourceOrDestination);
+    Combine(tile, LookPicture(size, selected ? SelectedLook : NormalLook),
+            QPainter::RasterOp_SourceAndDestination);
+    QPixmap picture = QPixmap::fromImage(
+        tile.scaled(devicePixels, devicePixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation));
+    picture.setDevicePixelRatio(pixelRatio);
+    return picture;
+}
+
+// Centred by what is seen of the letter, which its advance and ascent are not.
+void PrintLetter(QPaintDevice* tile, const QString& letter) {
+    QPainterPath glyphs;
+    glyphs.addText(0, 0, LayoutFont(Typeface::Courier, LetterPoints), letter);
+    const QPointF middle(TileSize / 2.0, TileSize / 2.0);
+    QPainter painter(tile);
+    painter.setRenderHint(QPainter::Antialiasing);
+    painter.translate(middle - glyphs.boundingRect().center());
+    painter.fillPath(glyphs, LetterColour);
+}
+
+}  // namespace
+
+QPixmap TilePicture(bool selected, const QString& letter, qreal pixelRatio, QColor background) {
+    static auto& pictures = *new QHash<QString, QPixmap>;  // outlives the application
+    const QString key =
+        QStringLiteral("%1/%2/%3/").arg(selected).arg(pixelRatio).arg(background.rgb()) + letter;
+    const auto kept = pictures.constFind(key);
+    if (kept != pictures.constEnd()) return *kept;
+    QPixmap picture = letter.isEmpty() ? BlankTile(selected, pixelRatio, background)
+                                       : TilePicture(selected, QString(), pixelRatio, background);
+    if (!letter.isEmpty()) PrintLetter(&picture, letter);
+    pictures.insert(key, picture);
+    return picture;
+}

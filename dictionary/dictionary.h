@@ -1,0 +1,25 @@
+#pragma once
+// The game's dealings with the dictionary that the word engine holds.
+#include <string>
+
+#include "game/game_state.h"
+
+namespace Dictionary {
+
+/// The path of Dictionary.dat.
+std::string FilePath();
+
+/// Loads Dictionary.dat; where that fails, the engine's dictionary stays empty.
+void LoadDictionary();
+
+/// Saves Dictionary.dat.
+void SaveDictionary();
+
+/// True when the dictionary holds the word (lower case).
+Boolean IsInDictionary(const std::string& word);
+
+/// Change the dictionary and mark it changed.
+void AddToDictionary(const std::string& word);
+void RemoveFromDictionary(const std::string& word);
+
+}  // namespace Dictionary

@@ -1,0 +1,74 @@
+#include "entry/check_cubes.h"
+
+#include <algorithm>
+
+namespace {
+
+constexpr std::string_view Qu = "qu";
+constexpr std::size_t LongestChainText = CubeCount * Qu.size();
+
+// What the next cube has to show. The Qu cube also takes a "q" that ends the
+// word: that is what has been typed when the "u" is still to come.
+std::string_view LetterUnit(std::string_view rest) {
+    if (rest == "q" || rest.starts_with(Qu)) return Qu;
+    return rest.substr(0, 1);
+}
+
+bool IsLastUnit(std::string_view rest) {
+    return rest.size() == 1 || rest == Qu;
+}
+
+void ClearTracedPath() {
+    for (std::size_t row = 0; row < BoardSize; ++row) {
+        for (std::size_t column = 0; column < BoardSize; ++column) {
+            State.TracedPath[row][column] = False;
+        }
+    }
+}
+
+bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view rest) {
+    const std::string_view unit = LetterUnit(rest);
+    const std::size_t lastRow = std::min<std::size_t>(fromRow + 1, BoardSize - 1);
+    const std::size_t lastColumn = std::min<std::size_t>(fromColumn + 1, BoardSize - 1);
+    for (std::size_t row = fromRow - std::min<std::size_t>(fromRow, 1); row <= lastRow; ++row) {
+        for (std::size_t column = fromColumn - std::min<std::size_t>(fromColumn, 1);
+             column <= lastColumn; ++column) {
+            Boolean& mark = State.TracedPath[row][column];
+            if (mark || State.BoardGrid[row][column] != unit) continue;
+            mark = True;
+            if (IsLastUnit(rest) || TraceFrom(row, column, rest.substr(unit.size()))) return true;
+            mark = False;
+        }
+    }
+    return false;
+}
+
+}  // namespace
+
+namespace CheckCubes {
+
+Boolean IsOnBoard(std::string_view word) {
+    if (word.empty()) {
+        ClearTracedPath();
+        return True;
+    }
+    const std::string_view unit = LetterUnit(word);
+    for (std::size_t row = 0; row < BoardSize; ++row) {
+        for (std::size_t column = 0; column < BoardSize; ++column) {
+            if (State.BoardGrid[row][column] != unit) continue;
+            ClearTracedPath();
+            State.TracedPath[row][column] = True;
+            if (IsLastUnit(word) || TraceFrom(row, column, word.substr(unit.size()))) return True;
+        }
+    }
+    return False;
+}
+
+// No chain spells more than its cubes can, so a long paste is cut to that first.
+std::size_t LongestOnBoard(std::string_view text) {
+    std::size_t length = std::min(text.size(), LongestChainText);
+    while (!IsOnBoard(text.substr(0, length))) --length;
+    return length;
+}
+
+}  // namespace CheckCubes

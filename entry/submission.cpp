@@ -1,0 +1,84 @@
+#include "entry/submission.h"
+
+#include <quorle/word_engine.h>
+
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QTableWidget>
+
+#include "board/draw_cubes.h"
+#include "dictionary/dictionary.h"
+#include "entry/check_cubes.h"
+#include "entry/typed_text.h"
+#include "entry/word_entry.h"
+#include "game/game_state.h"
+#include "game/main_window.h"
+#include "game/windows.h"
+#include "platform/layout.h"
+
+namespace {
+
+bool IsEntered(const QTableWidget& list, const QString& word) {
+    for (int row = 0; row < list.rowCount(); ++row) {
+        if (list.item(row, 0)->text() == word) return true;
+    }
+    return false;
+}
+
+void ListWord(Main& window, const std::string& word) {
+    QTableWidget& list = *window.WordList;
+    const QString text = QString::fromStdString(word);
+    list.insertRow(0);
+    auto* cell = new QTableWidgetItem(text);
+    QFont font = Condensed(LayoutFont(Typeface::Courier, 18, true), text,
+                           list.viewport()->width() - CellPadding);
+    if (!Dictionary::IsInDictionary(word)) {
+        font.setStrikeOut(true);
+        cell->setData(Qt::AccessibleDescriptionRole, "not in dictionary");
+        Common::PlayWarning();
+    }
+    cell->setFont(font);
+    list.setItem(0, 0, cell);
+    list.setCurrentCell(0, 0, QItemSelectionModel::NoUpdate);
+    list.scrollToTop();
+    const int count = list.rowCount();
+    window.PlayerWordLabel->setText(count == 1 ? QString("1 word entered")
+                                               : QString("%1 words entered").arg(count));
+}
+
+void EmptyNewWord(Main& window) {
+    window.NewWord->clear();
+    Common::DrawAllCubesNormal();
+}
+
+}  // namespace
+
+namespace Common {
+
+void Submit() {
+    if (State.TimeRemaining == 0) return;
+    Main& window = Windows::Shared<Main>();
+    const std::string word = LowerCase(window.NewWord->text().toStdString());
+    State.PickedWord.clear();
+    State.PickedCount = 0;
+    const auto length = static_cast<std::int32_t>(word.size());
+    if (length < cMinWordSize()) return;
+    if (length > cMaxWordSize()) {
+        EmptyNewWord(window);
+        return;
+    }
+    if (CheckCubes::IsOnBoard(word)) {
+        if (IsEntered(*window.WordList, QString::fromStdString(word))) {
+            EmptyNewWord(window);
+            return;
+        }
+        ListWord(window, word);
+    }
+    window.NewWord->clear();
+    window.NewWord->setFocus();
+    SetDefaultButton(&window, window.Enter);
+    DrawAllCubesNormal();
+}
+
+}  // namespace Common

@@ -1,0 +1,178 @@
+#include "game/main_window.h"
+
+#include <QCloseEvent>
+#include <QCoreApplication>
+#include <QFrame>
+#include <QHeaderView>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QTableWidget>
+#include <QTimer>
+#include <QToolButton>
+
+#include "board/cube_tile.h"
+#include "board/tile_picture.h"
+#include "entry/submission.h"
+#include "entry/word_entry.h"
+#include "game/game_flow.h"
+#include "game/shutdown.h"
+#include "game/start_up.h"
+#include "game/toolbar_pictures.h"
+#include "platform/layout.h"
+#include "platform/platform.h"
+
+namespace {
+
+constexpr int ClientWidth = 9300;
+constexpr int ClientHeight = 7710;
+constexpr int ToolBarHeight = 480;
+constexpr int ToolButtonWidth = 495;
+constexpr int ToolButtonHeight = 435;
+constexpr int ToolPictureSize = 16;
+constexpr int TilePitch = 1440;
+constexpr int TileSide = TileSize * TwipsPerPixel;
+constexpr int FirstTileTop = 240;
+constexpr int ClockInterval = 1000;
+
+QFont WordFont() {
+    return LayoutFont(Typeface::Courier, 18, true);
+}
+QFont MainFont() {
+    return LayoutFont(Typeface::SansSerif, 18);
+}
+QFont SmallerFont() {
+    return LayoutFont(Typeface::SansSerif, 13.5);
+}
+
+}  // namespace
+
+Main::Main() {
+    setObjectName("Main");
+    setWindowTitle(Platform::ProgramTitle);
+    setWindowFlags(Qt::Window | Qt::WindowTitleHint | Qt::WindowSystemMenuHint |
+                   Qt::WindowMinimizeButtonHint | Qt::WindowCloseButtonHint);
+    setFixedSize(Twips(ClientWidth), Twips(ClientHeight));
+    makeToolBar();
+    makeBoard();
+    makeWordEntry();
+    makeLabels();
+    makeWordList();
+    setPictures();
+    SetDefaultButton(this, Enter);
+
+    GameClock = new QTimer(this);
+    GameClock->setObjectName("GameClock");
+    GameClock->setTimerType(Qt::PreciseTimer);
+    GameClock->setInterval(ClockInterval);
+    connect(GameClock, &QTimer::timeout, this, [] { Common::ClockTick(); });
+}
+
+void Main::load() {
+    Common::StartUp();
+}
+
+void Main::makeToolBar() {
+    ToolBar = new QWidget(this);
+    SetUp(ToolBar, "ToolBar", {0, 0, ClientWidth, ToolBarHeight}, MainFont());
+    Start = makeToolButton("Start", 0, "Start game");
+    Pause = makeToolButton("Pause", 480, "Pause game");
+    End = makeToolButton("End", 960, "End game");
+    Options = makeToolButton("Options", 1800, "Options");
+    Dictionary = makeToolButton("Dictionary", 2280, "Dictionary editor");
+    HelpButton = makeToolButton("HelpButton", 3120, "");
+    Exit = makeToolButton("Exit", 3960, "Exit game");
+    HelpButton->setText("?");
+    HelpButton->setAccessibleName("Help");
+    connect(Start, &QToolButton::clicked, this, [] { Common::StartGame(); });
+    connect(Pause, &QToolButton::clicked, this, [] { Common::PauseGame(); });
+    connect(End, &QToolButton::clicked, this, [] { Common::StopGame(); });
+    connect(Exit, &QToolButton::clicked, this, [] { Common::ExitProgram(); });
+}
+
+QToolButton* Main::makeToolButton(const char* name, int left, const char* toolTip) {
+    auto* button = new QToolButton(ToolBar);
+    SetUp(button, name, {left, 15, ToolButtonWidth, ToolButtonHeight}, MainFont());
+    button->setToolTip(toolTip);
+    button->setAccessibleName(toolTip);
+    button->setIconSize({ToolPictureSize, ToolPictureSize});
+    button->setFocusPolicy(Qt::TabFocus);
+    return button;
+}
+
+void Main::setPictures() {
+    Start->setIcon(ToolbarIcon(ToolbarPicture::Start, palette()));
+    Pause->setIcon(ToolbarIcon(ToolbarPicture::Pause, palette()));
+    End->setIcon(ToolbarIcon(ToolbarPicture::End, palette()));
+    Options->setIcon(ToolbarIcon(ToolbarPicture::Options, palette()));
+    Dictionary->setIcon(ToolbarIcon(ToolbarPicture::Dictionary, palette()));
+    Exit->setIcon(ToolbarIcon(ToolbarPicture::Exit, palette()));
+}
+
+void Main::makeBoard() {
+    CubeFrame = new QFrame(this);
+    SetUp(CubeFrame, "CubeFrame", {120, 480, 5775, 6015}, MainFont());
+    for (int k = 0; k < 16; ++k) {
+        auto* tile = new CubeTile(CubeFrame);
+        const QByteArray name = "Cube" + QByteArray::number(k);
+        SetUp(tile, name.constData(),
+              {TilePitch * (k % 4), FirstTileTop + TilePitch * (k / 4), TileSide, TileSide},
+              LayoutFont(Typeface::Courier, 48));
+        connect(tile, &CubeTile::clicked, this,
+                [k] { Common::CubeClick(static_cast<std::int16_t>(k)); });
+        connect(tile, &CubeTile::doubleClicked, this,
+                [k] { Common::CubeDoubleClick(static_cast<std::int16_t>(k)); });
+        Cube[static_cast<std::size_t>(k)] = tile;
+    }
+}
+
+void Main::makeWordEntry() {
+    NewWord = new QLineEdit(this);
+    SetUp(NewWord, "NewWord", {120, 6960, 3735, 615}, WordFont());
+    NewWord->setEnabled(false);
+    NewWord->setAccessibleName("New word");
+    connect(NewWord, &QLineEdit::textChanged, this, [] { Common::WordTyped(); });
+
+    Enter = new QPushButton("Enter", this);
+    SetUp(Enter, "Enter", {3960, 6960, 975, 615}, SmallerFont());
+    Enter->setFocusPolicy(Qt::TabFocus);
+    connect(Enter, &QPushButton::clicked, this, [] { Common::Submit(); });
+
+    Clear = new QPushButton("Clear", this);
+    SetUp(Clear, "Clear", {5040, 6960, 855, 615}, SmallerFont());
+    Clear->setFocusPolicy(Qt::TabFocus);
+    connect(Clear, &QPushButton::clicked, this, [] { Common::ClearLetter(); });
+}
+
+void Main::makeLabels() {
+    TimeRemLabel = MakeLabel(this, "TimeRemLabel", {6120, 600, 3015, 495}, MainFont());
+    TimeLeft =
+        MakeLabel(this, "TimeLeft", {6240, 1200, 2775, 735}, LayoutFont(Typeface::Arial, 30));
+    PlayerWordLabel = MakeLabel(this, "PlayerWordLabel", {6000, 6360, 3255, 495}, SmallerFont());
+    DefinedWordCount = MakeLabel(this, "DefinedWordCount", {6120, 6960, 3015, 375}, SmallerFont());
+}
+
+void Main::makeWordList() {
+    WordList = new QTableWidget(0, 1, this);
+    SetUp(WordList, "WordList", {6120, 2160, 3015, 4095}, WordFont());
+    WordList->setAccessibleName("Your words");
+    WordList->horizontalHeader()->hide();
+    WordList->verticalHeader()->hide();
+    WordList->setEditTriggers(QTableWidget::NoEditTriggers);
+    WordList->setSelectionMode(QTableWidget::SingleSelection);
+    WordList->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    WordList->setTabKeyNavigation(false);
+    WordList->setShowGrid(false);
+}
+
+// A running game is dropped; the window manager, Alt+F4 and Exit all come here.
+void Main::closeEvent(QCloseEvent* event) {
+    Common::ExitProgram();
+    event->accept();
+    QCoreApplication::quit();
+}
+
+void Main::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange && Exit != nullptr) setPictures();
+}

@@ -1,0 +1,100 @@
+#include "game/settings.h"
+
+#include <quorle/word_engine.h>
+
+#include <algorithm>
+#include <array>
+#include <charconv>
+
+#include "game/game_state.h"
+#include "platform/platform.h"
+
+namespace {
+
+constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
+constexpr std::array<std::int16_t, 7> GameTimes{15, 30, 60, 120, 180, 240, 300};
+constexpr std::int16_t DefaultTimeLimit = 180;
+constexpr std::int16_t SmallestWordSize = 2;
+constexpr std::int16_t LargestWordSize = 16;
+constexpr std::int16_t DefaultMinWordSize = 3;
+
+std::optional<std::string> ReadValue(const char* name) {
+    std::string buffer = "1234567890";
+    auto length = static_cast<std::int32_t>(buffer.size());
+    cGetRegValue(KeyPath, name, buffer.data(), &length);
+    if (length <= 0) return std::nullopt;
+    return buffer.substr(0, static_cast<std::size_t>(length));
+}
+
+std::optional<std::int16_t> ReadNumber(const char* name) {
+    const auto text = ReadValue(name);
+    return text ? Common::SettingNumber(*text) : std::nullopt;
+}
+
+void WriteValue(const char* name, const std::string& text) {
+    cSetRegValue(KeyPath, name, text.c_str(), static_cast<std::int32_t>(text.size()));
+}
+
+std::int16_t WordSizeOr(std::int16_t size, std::int16_t otherwise) {
+    return size >= SmallestWordSize && size <= LargestWordSize ? size : otherwise;
+}
+
+}  // namespace
+
+namespace Common {
+
+std::optional<std::int16_t> SettingNumber(std::string_view text) {
+    std::int16_t number = 0;
+    const char* end = text.data() + text.size();
+    const auto [stopped, error] = std::from_chars(text.data(), end, number);
+    if (error != std::errc() || stopped != end) return std::nullopt;
+    return number;
+}
+
+void LoadSettings() {
+    if (const auto seconds = ReadNumber("TimeLimit")) {
+        const bool offered =
+            std::find(GameTimes.begin(), GameTimes.end(), *seconds) != GameTimes.end();
+        State.TimeLimit = offered ? *seconds : DefaultTimeLimit;
+    }
+    if (const auto size = ReadNumber("MinWordSize")) {
+        cSetMinWordSize(WordSizeOr(*size, DefaultMinWordSize));
+    }
+    if (const auto size = ReadNumber("MaxWordSize")) {
+        ReconcileMaxWordSize(WordSizeOr(*size, LargestWordSize));
+    }
+    const auto sounds = ReadValue("Sounds");
+    State.Sounds = ToBoolean(!sounds || *sounds == "1");
+}
+
+void SaveSettings() {
+    WriteValue("TimeLimit", std::to_string(State.TimeLimit));
+    WriteValue("MinWordSize", std::to_string(cMinWordSize()));
+    WriteValue("MaxWordSize", std::to_string(cMaxWordSize()));
+    WriteValue("Sounds", State.Sounds ? "1" : "0");
+}
+
+void ReconcileMaxWordSize(std::int16_t size) {
+    if (size > cMaxWordSize()) {
+        Platform::ShowMessage("WARNING - dictionary is limited to words that have no more than " +
+                                  std::to_string(cMaxWordSize()) +
+                                  " letters, resetting Max Word Size option",
+                              Platform::ProgramTitle);
+    }
+    if (size >= cMaxWordSize()) return;
+    const bool remove =
+        Platform::AskYesNo("Dictionary contains words longer than " + std::to_string(size) +
+                               " letters, is it OK to remove the longer words from the dictionary?",
+                           Platform::ProgramTitle);
+    if (remove) {
+        cSetMaxWordSize(size);
+        cReduceWordSize();
+        State.DictionaryChanged = True;
+    } else {
+        Platform::ShowMessage(
+            "Setting Max Word Size option to " + std::to_string(cMaxWordSize()) + " letters",
+            Platform::ProgramTitle);
+    }
+}
+
+}  // namespace Common

@@ -1,0 +1,8 @@
+#pragma once
+#include <QIcon>
+
+class QPalette;
+
+/// The pictures of the toolbar's buttons, drawn for a palette, crisp at any scale.
+enum class ToolbarPicture { Start, Pause, End, Options, Dictionary, Exit };
+QIcon ToolbarIcon(ToolbarPicture picture, const QPalette& palette);

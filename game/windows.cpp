@@ -1,0 +1,13 @@
+#include "game/windows.h"
+
+#include "game/main_window.h"
+#include "results/results_window.h"
+
+namespace Windows {
+
+void DestroyAll() {
+    delete Existing<Results>;
+    delete Existing<Main>;
+}
+
+}  // namespace Windows

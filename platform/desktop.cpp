@@ -1,0 +1,21 @@
+// The desktop's own functions behind the platform's names.
+#include "platform/file_dialog.h"
+#include "platform/message_box.h"
+#include "platform/platform.h"
+#include "platform/program_folder.h"
+#include "platform/warning_sound.h"
+#include "platform/window_front.h"
+
+namespace Platform {
+
+void UseDesktop() {
+    ShowMessage = MessageBox::Show;
+    AskYesNo = MessageBox::Ask;
+    ChooseFileToOpen = FileDialog::ChooseToOpen;
+    ChooseFileToSave = FileDialog::ChooseToSave;
+    WarningSound = WarningSound::Play;
+    WindowInFront = WindowFront::Number;
+    ProgramFolder = [folder = FindProgramFolder()] { return folder; };
+}
+
+}  // namespace Platform

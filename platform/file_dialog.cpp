@@ -1,0 +1,68 @@
+#include "platform/file_dialog.h"
+
+#include <QFileDialog>
+#include <QFileInfo>
+
+#include "platform/message_box.h"
+#include "platform/window_front.h"
+
+namespace {
+
+// Details hidden, the dialog shows the names alone, and "*" in them lets files
+// without a dot through where "*.*" would not.
+constexpr const char* AllFiles = "All Files (*.*) (*)";
+constexpr const char* TextFiles = "Text Files (*.txt) (*.txt)";
+
+void SetUpDialog(QFileDialog& dialog, const std::string& folder) {
+    dialog.setObjectName("CommonDialog");
+    dialog.setOption(QFileDialog::HideNameFilterDetails);
+    dialog.setNameFilters({AllFiles, TextFiles});
+    dialog.selectNameFilter(TextFiles);
+    dialog.setDirectory(QString::fromStdString(folder));
+    dialog.setWindowModality(Qt::ApplicationModal);
+}
+
+QString Run(QFileDialog& dialog) {
+    const bool accepted = dialog.exec() == QDialog::Accepted;
+    dialog.hide();
+    WindowFront::GiveBack();
+    const QStringList files = dialog.selectedFiles();
+    return accepted && !files.isEmpty() ? files.first() : QString();
+}
+
+std::string PathOf(const QString& file) {
+    return QFile::encodeName(file).toStdString();
+}
+
+bool MayReplace(const QString& file) {
+    if (!QFileInfo::exists(file)) return true;
+    return MessageBox::Ask(
+        QFileInfo(file).fileName().toStdString() + " already exists. Do you want to replace it?",
+        "Quorle");
+}
+
+}  // namespace
+
+namespace FileDialog {
+
+std::string ChooseToOpen(const std::string& folder) {
+    QFileDialog dialog(WindowFront::Latest(), QFileDialog::tr("Open"));
+    SetUpDialog(dialog, folder);
+    dialog.setFileMode(QFileDialog::ExistingFile);
+    return PathOf(Run(dialog));
+}
+
+// The suffix is added here, after the dialog has asked about the name as typed,
+// so that the name with its suffix is asked about as well.
+std::string ChooseToSave(const std::string& folder) {
+    QFileDialog dialog(WindowFront::Latest(), QFileDialog::tr("Save As"));
+    SetUpDialog(dialog, folder);
+    dialog.setAcceptMode(QFileDialog::AcceptSave);
+    dialog.setFileMode(QFileDialog::AnyFile);
+    QString file = Run(dialog);
+    if (file.isEmpty() || !QFileInfo(file).suffix().isEmpty()) return PathOf(file);
+    file += ".txt";
+    return MayReplace(file) ? PathOf(file) : std::string();
+}
+
+}  // namespace FileDialog

@@ -1,0 +1,94 @@
+#include "platform/layout.h"
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QFontMetrics>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QVariant>
+#include <cmath>
+
+namespace {
+
+constexpr double PixelsPerPoint = 96.0 / 72.0;
+constexpr int PlainFontPixels = 11;
+constexpr const char* DefaultButtonProperty = "defaultButton";
+
+QFont FontOf(Typeface typeface, int pixels, bool bold) {
+    QFont font;
+    switch (typeface) {
+        case Typeface::SansSerif:
+            font.setFamilies({"MS Sans Serif", "Liberation Sans", "sans-serif"});
+            break;
+        case Typeface::Arial:
+            font.setFamilies({"Arial", "Liberation Sans", "sans-serif"});
+            break;
+        case Typeface::Courier:
+            font.setFamilies({"Courier New", "Liberation Mono", "monospace"});
+            font.setStyleHint(QFont::TypeWriter);
+            break;
+    }
+    font.setPixelSize(pixels);
+    font.setBold(bold);
+    return font;
+}
+
+// The filter sees a key before any control does: a shortcut would depend on the
+// toolkit's idea of the active window, and lists and buttons take Return.
+class ReturnKeys : public QObject {
+  public:
+    using QObject::QObject;
+
+    bool eventFilter(QObject* receiver, QEvent* event) override {
+        if (event->type() != QEvent::KeyPress || !receiver->isWidgetType()) return false;
+        const auto* key = static_cast<QKeyEvent*>(event);
+        if (key->key() != Qt::Key_Return && key->key() != Qt::Key_Enter) return false;
+        if ((key->modifiers() & ~Qt::KeypadModifier) != Qt::NoModifier) return false;
+        const QWidget* window = static_cast<QWidget*>(receiver)->window();
+        auto* button = window->property(DefaultButtonProperty).value<QAbstractButton*>();
+        if (button == nullptr) return false;
+        button->click();
+        return true;
+    }
+};
+
+}  // namespace
+
+QFont LayoutFont(Typeface typeface, double points, bool bold) {
+    return FontOf(typeface, static_cast<int>(std::lround(points * PixelsPerPoint)), bold);
+}
+
+QFont PlainFont() {
+    return FontOf(Typeface::SansSerif, PlainFontPixels, false);
+}
+
+void SetUp(QWidget* control, const char* name, TwipsRect place, const QFont& font) {
+    control->setObjectName(name);
+    control->setGeometry(Twips(place.left), Twips(place.top), Twips(place.width),
+                         Twips(place.height));
+    control->setFont(font);
+}
+
+QLabel* MakeLabel(QWidget* parent, const char* name, TwipsRect place, const QFont& font) {
+    auto* label = new QLabel(parent);
+    SetUp(label, name, place, font);
+    label->setAlignment(Qt::AlignCenter);
+    label->setTextFormat(Qt::PlainText);
+    return label;
+}
+
+void SetDefaultButton(QWidget* window, QAbstractButton* button) {
+    static ReturnKeys* const keys = [] {
+        auto* filter = new ReturnKeys(qApp);
+        qApp->installEventFilter(filter);
+        return filter;
+    }();
+    Q_UNUSED(keys)
+    window->setProperty(DefaultButtonProperty, QVariant::fromValue(button));
+}
+
+QFont Condensed(QFont font, const QString& text, int width) {
+    const int natural = QFontMetrics(font).horizontalAdvance(text);
+    if (natural > width) font.setStretch(QFont::Unstretched * width / natural);
+    return font;
+}

@@ -1,0 +1,7 @@
+#pragma once
+#include <string>
+
+/// The folder of Dictionary.dat and Quorle.htm: the executable's own, or, for an
+/// installed copy, the player's data folder, furnished on first use with the
+/// installed dictionary and a link to the help page.
+std::string FindProgramFolder();

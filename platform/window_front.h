@@ -1,0 +1,29 @@
+#pragma once
+// Which window of ours is in front, and how windows come there and leave. Not
+// every desktop gives the front back when a box closes or a window hides, and
+// with no window in front the game's clock stands still; so we do it ourselves.
+#include <QWidget>
+#include <cstdint>
+
+namespace WindowFront {
+
+/// Follows a window, known by its object name, from now until it is deleted.
+void Follow(QWidget* window);
+
+/// Shows a window, or brings it back: restored, raised and activated.
+void Bring(QWidget& window);
+
+/// Hides a window; when it was in front, gives the front back.
+void Hide(QWidget& window);
+
+/// Activates the window that was in front last and is still shown, else the
+/// main window. For when something in front has gone.
+void GiveBack();
+
+/// The followed window that is or last was in front and is shown; may be null.
+QWidget* Latest();
+
+/// See Platform::WindowInFront.
+std::int32_t Number();
+
+}  // namespace WindowFront

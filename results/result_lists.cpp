@@ -1,0 +1,62 @@
+#include "results/result_lists.h"
+
+#include <QLabel>
+#include <QListWidget>
+#include <QSignalBlocker>
+
+#include "platform/layout.h"
+
+namespace {
+
+const QColor PlainColour(255, 192, 128);
+const QColor LitColour(128, 255, 128);
+
+}  // namespace
+
+void AddWord(QListWidget& list, const QString& word) {
+    auto* item = new QListWidgetItem(word);
+    const int room = list.width() - 2 * list.frameWidth() - CellPadding;
+    const QFont fitting = Condensed(list.font(), word, room);
+    if (fitting != list.font()) item->setFont(fitting);
+    list.addItem(item);
+}
+
+QString SelectedWord(const QListWidget& list) {
+    const auto selected = list.selectedItems();
+    return selected.isEmpty() ? QString() : selected.first()->text();
+}
+
+int SelectedIndex(const QListWidget& list) {
+    const auto selected = list.selectedItems();
+    return selected.isEmpty() ? -1 : list.row(selected.first());
+}
+
+// A list selects the neighbour of a selected item before the item is gone.
+void TakeWord(QListWidget& list, int index) {
+    const QSignalBlocker quiet(list.selectionModel());
+    const QSignalBlocker quietList(list);
+    delete list.takeItem(index);
+    list.clearSelection();
+}
+
+int IndexOf(const QListWidget& list, const QString& word) {
+    for (int i = 0; i < list.count(); ++i) {
+        if (list.item(i)->text() == word) return i;
+    }
+    return -1;
+}
+
+Common::Tally TallyOf(const QListWidget& list) {
+    Common::Tally tally;
+    for (int i = 0; i < list.count(); ++i) {
+        Common::Count(tally, list.item(i)->text().toStdString());
+    }
+    return tally;
+}
+
+void LightResultCube(QLabel& cube, bool lit) {
+    QPalette palette = cube.palette();
+    palette.setColor(QPalette::Window, lit ? LitColour : PlainColour);
+    cube.setPalette(palette);
+    cube.setProperty("selected", lit);
+}

@@ -1,0 +1,28 @@
+#pragma once
+// The sorted word lists and the small board of the results window.
+#include <QString>
+
+#include "results/scoring.h"
+
+class QLabel;
+class QListWidget;
+
+/// Adds a word in its alphabetical place.
+void AddWord(QListWidget& list, const QString& word);
+
+/// The word selected, and its index; an empty text and -1 when none is.
+QString SelectedWord(const QListWidget& list);
+int SelectedIndex(const QListWidget& list);
+
+/// Takes the word at `index` out without selecting another.
+void TakeWord(QListWidget& list, int index);
+
+/// The first index of a word, -1 when it is not listed.
+int IndexOf(const QListWidget& list, const QString& word);
+
+/// Words and points of a list.
+Common::Tally TallyOf(const QListWidget& list);
+
+/// Gives a cube of the small board its lit or its plain colour, and its property
+/// `selected`.
+void LightResultCube(QLabel& cube, bool lit);
