@@ -19,6 +19,7 @@
 #include "game/shutdown.h"
 #include "game/start_up.h"
 #include "game/toolbar_pictures.h"
+#include "help/help_commands.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
 
@@ -87,6 +88,7 @@ void Main::makeToolBar() {
     connect(Start, &QToolButton::clicked, this, [] { Common::StartGame(); });
     connect(Pause, &QToolButton::clicked, this, [] { Common::PauseGame(); });
     connect(End, &QToolButton::clicked, this, [] { Common::StopGame(); });
+    connect(HelpButton, &QToolButton::clicked, this, [] { Common::OpenHelp(); });
     connect(Exit, &QToolButton::clicked, this, [] { Common::ExitProgram(); });
 }
 

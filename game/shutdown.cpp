@@ -7,6 +7,7 @@
 #include "game/main_window.h"
 #include "game/settings.h"
 #include "game/windows.h"
+#include "help/help_window.h"
 #include "platform/platform.h"
 #include "results/results_window.h"
 
@@ -37,6 +38,7 @@ namespace Common {
 void ExitProgram() {
     OfferDictionarySave();
     CloseIfOpen<Results>();
+    CloseIfOpen<HelpBrowser>();
     Windows::Shared<Main>().close();
 }
 

@@ -1,0 +1,28 @@
+#include "help/help_commands.h"
+
+#include <QFile>
+#include <QTextBrowser>
+#include <QUrl>
+
+#include "game/windows.h"
+#include "help/help_window.h"
+#include "platform/platform.h"
+
+namespace Common {
+
+void OpenHelp() {
+    ShowHelpPage();
+    WindowFront::Bring(Windows::Shared<HelpBrowser>());
+}
+
+void ShowHelpPage() {
+    const std::string page = Platform::ProgramFolder() + "/Quorle.htm";
+    Windows::Shared<HelpBrowser>().WebBrowser->setSource(
+        QUrl::fromLocalFile(QFile::decodeName(page.c_str())));
+}
+
+void HideHelp() {
+    WindowFront::Hide(Windows::Shared<HelpBrowser>());
+}
+
+}  // namespace Common
