@@ -155,11 +155,12 @@ void Main::makeLabels() {
 }
 
 void Main::makeWordList() {
-    WordList = new QTableWidget(0, 1, this);
+    WordList = new QTableWidget(this);
     SetUp(WordList, "WordList", {6120, 2160, 3015, 4095}, WordFont());
     WordList->setAccessibleName("Your words");
     WordList->horizontalHeader()->hide();
     WordList->verticalHeader()->hide();
+    WordList->setColumnCount(1);
     WordList->setEditTriggers(QTableWidget::NoEditTriggers);
     WordList->setSelectionMode(QTableWidget::SingleSelection);
     WordList->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);

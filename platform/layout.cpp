@@ -28,6 +28,8 @@ QFont FontOf(Typeface typeface, int pixels, bool bold) {
             font.setStyleHint(QFont::TypeWriter);
             break;
     }
+    // Our texts are ASCII; looking for fonts that fill gaps would delay the start.
+    font.setStyleStrategy(QFont::NoFontMerging);
     font.setPixelSize(pixels);
     font.setBold(bold);
     return font;
