@@ -1,0 +1,67 @@
+#include "support/box_answers.h"
+
+#include <gtest/gtest.h>
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QTest>
+
+namespace {
+
+constexpr int LookInterval = 2;  // milliseconds
+
+std::string TextOf(const QWidget& window) {
+    const auto* box = qobject_cast<const QMessageBox*>(&window);
+    return (box == nullptr ? window.objectName() : box->text()).toStdString();
+}
+
+}  // namespace
+
+BoxAnswers::BoxAnswers() {
+    timer_.setInterval(LookInterval);
+    QObject::connect(&timer_, &QTimer::timeout, &timer_, [this] { look(); });
+    timer_.start();
+}
+
+void BoxAnswers::expect(const std::string& title, const std::string& text,
+                        QMessageBox::StandardButtons buttons, QMessageBox::StandardButton answer,
+                        const std::function<void()>& whileUp) {
+    expectModal([=](QWidget& window) {
+        auto* box = qobject_cast<QMessageBox*>(&window);
+        ASSERT_NE(box, nullptr) << "no message box, but " << TextOf(window);
+        EXPECT_EQ(box->windowTitle().toStdString(), title);
+        EXPECT_EQ(box->text().toStdString(), text);
+        EXPECT_EQ(box->standardButtons(), buttons);
+        EXPECT_EQ(box->icon(), QMessageBox::NoIcon);
+        EXPECT_EQ(box->windowModality(), Qt::ApplicationModal);
+        if (whileUp) whileUp();
+        ASSERT_NE(box->button(answer), nullptr);
+        QTest::mouseClick(box->button(answer), Qt::LeftButton);
+    });
+}
+
+void BoxAnswers::expectModal(const std::function<void(QWidget&)>& act) {
+    expected_.push_back(act);
+}
+
+// What a test leaves open would hold it for ever, so it is closed.
+void BoxAnswers::look() {
+    QWidget* window = QApplication::activeModalWidget();
+    if (busy_ || window == nullptr || !window->isVisible()) return;
+    busy_ = true;
+    if (expected_.empty()) {
+        if (!dismissAll_) ADD_FAILURE() << "unexpected: " << TextOf(*window);
+        QTest::keyClick(window, Qt::Key_Escape);
+    } else {
+        const auto act = expected_.front();
+        expected_.pop_front();
+        act(*window);
+    }
+    if (QApplication::activeModalWidget() == window) window->close();
+    busy_ = false;
+}
+
+void BoxAnswers::verify() {
+    EXPECT_TRUE(expected_.empty()) << expected_.size() << " expected windows have not come";
+    expected_.clear();
+}

@@ -1,0 +1,44 @@
+#pragma once
+// A program of its own for each test: fresh state, folders, settings and engine,
+// and a desktop that does what the test says. Names no Qt.
+#include <gtest/gtest.h>
+
+#include <deque>
+#include <random>
+#include <string>
+#include <vector>
+
+#include "engine/temp_folder.h"
+#include "game/game_state.h"
+
+class GameFixture : public testing::Test {
+  protected:
+    GameFixture();
+
+    /// Writes the program folder's dictionary, and leaves the engine as at start.
+    void makeDictionary(const std::vector<std::string>& words, int maximum = 16);
+
+    /// The settings file's values; an empty text where there is none.
+    static void store(const std::string& name, const std::string& text);
+    static std::string stored(const std::string& name);
+
+    /// Puts the test's functions behind the platform's names, but those that
+    /// show something.
+    void useTestDesktop();
+
+    /// Puts letters on the board as a shake would, without a window.
+    static void putOnBoard(const std::string& board);
+
+    /// The next shake gives this board. Others are random, from a fixed seed.
+    void shakeNext(const std::string& board);
+
+    TempFolder folder_;        ///< home, and below it the program folder
+    std::deque<float> draws_;  ///< the next numbers of the random source
+    std::mt19937 randomness_;  ///< the numbers after those
+    int drawn_ = 0;            ///< numbers taken
+    int warnings_ = 0;         ///< warning sounds asked for
+    double seconds_ = 1000;    ///< the steady clock
+};
+
+/// Lets the program run in a folder: its home and everything the desktop keeps there.
+void UseHome(const std::string& folder);

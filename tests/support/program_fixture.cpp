@@ -1,0 +1,193 @@
+#include "support/program_fixture.h"
+
+#include <QAbstractButton>
+#include <QAbstractItemView>
+#include <QApplication>
+#include <QClipboard>
+#include <QLabel>
+#include <QLineEdit>
+#include <QTest>
+#include <QTimer>
+#include <QTimerEvent>
+#include <stdexcept>
+
+#include "game/main_window.h"
+#include "game/windows.h"
+#include "platform/platform.h"
+
+ProgramFixture::~ProgramFixture() {
+    boxes_.verify();
+    Windows::DestroyAll();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
+
+void ProgramFixture::launch() {
+    Platform::UseDesktop();
+    useTestDesktop();
+    Main& window = Windows::Shared<Main>();
+    EXPECT_EQ(clock().interval(), 1000);
+    clock().setInterval(3'600'000);
+    window.show();
+    bringToFront("Main");
+}
+
+void ProgramFixture::start(const std::string& board) {
+    shakeNext(board);
+    press("Start");
+}
+
+void ProgramFixture::clickOn(const QWidget& widget, const QPoint& place, Qt::MouseButton button) {
+    const QWidget* window = widget.window();
+    QTest::mouseClick(window->windowHandle(), button, {}, widget.mapTo(window, place));
+}
+
+void ProgramFixture::press(const std::string& button) {
+    clickOn(*control(button), control(button)->rect().center(), Qt::LeftButton);
+}
+
+void ProgramFixture::type(const std::string& text) {
+    for (const QChar letter : QString::fromStdString(text)) {
+        QWidget* focus = QApplication::focusWidget();
+        if (focus == nullptr) throw std::logic_error("nothing has the focus");
+        QTest::sendKeyEvent(QTest::Click, focus, Qt::Key_unknown, QString(letter), Qt::NoModifier);
+    }
+}
+
+void ProgramFixture::key(Qt::Key key, Qt::KeyboardModifiers modifiers) {
+    QWidget* focus = QApplication::focusWidget();
+    if (focus == nullptr) throw std::logic_error("nothing has the focus");
+    QTest::keyClick(focus, key, modifiers);
+}
+
+void ProgramFixture::paste(const std::string& text) {
+    QApplication::clipboard()->setText(QString::fromStdString(text));
+    key(Qt::Key_V, Qt::ControlModifier);
+}
+
+void ProgramFixture::click(int tile, Qt::MouseButton button) {
+    const QWidget& clicked = *control("Cube" + std::to_string(tile));
+    clickOn(clicked, clicked.rect().center(), button);
+}
+
+void ProgramFixture::clickTiles(const Tiles& tiles) {
+    for (const int tile : tiles) click(tile);
+}
+
+void ProgramFixture::doubleClick(int tile) {
+    QWidget* clicked = control("Cube" + std::to_string(tile));
+    const QPoint place = clicked->mapTo(clicked->window(), clicked->rect().center());
+    QTest::mouseDClick(clicked->window()->windowHandle(), Qt::LeftButton, {}, place);
+}
+
+void ProgramFixture::select(const std::string& list, const std::string& word) {
+    QAbstractItemView& shown = view(list);
+    const auto found = shown.model()->match(shown.model()->index(0, 0), Qt::DisplayRole,
+                                            QString::fromStdString(word), 1, Qt::MatchExactly);
+    if (found.isEmpty()) throw std::logic_error(list + " has no " + word);
+    shown.scrollTo(found.first());
+    clickOn(*shown.viewport(), shown.visualRect(found.first()).center(), Qt::LeftButton);
+}
+
+void ProgramFixture::bringToFront(const std::string& window) {
+    control(window)->activateWindow();
+    if (!QTest::qWaitForWindowActive(control(window))) throw std::logic_error("not in front");
+}
+
+void ProgramFixture::closeByTitleBar(const std::string& window) {
+    control(window)->close();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
+
+void ProgramFixture::tick(int times) {
+    for (int i = 0; i < times && clock().isActive(); ++i) {
+        QTimerEvent event(clock().timerId());
+        QCoreApplication::sendEvent(&clock(), &event);
+    }
+}
+
+QTimer& ProgramFixture::clock() {
+    auto* found = control("Main")->findChild<QTimer*>("GameClock");
+    if (found == nullptr) throw std::logic_error("no clock");
+    return *found;
+}
+
+QWidget* ProgramFixture::find(const std::string& name) {
+    const auto slash = name.find('/');
+    const QString window =
+        QString::fromStdString(slash == name.npos ? "Main" : name.substr(0, slash));
+    const QString wanted = QString::fromStdString(name.substr(slash + 1));
+    QWidget* elsewhere = nullptr;
+    for (QWidget* top : QApplication::topLevelWidgets()) {
+        if (top->objectName() == wanted) return top;
+        auto* found = top->findChild<QWidget*>(wanted);
+        if (found == nullptr) continue;
+        if (top->objectName() == window) return found;
+        if (slash == name.npos) elsewhere = found;
+    }
+    return elsewhere;
+}
+
+QWidget* ProgramFixture::control(const std::string& name) {
+    QWidget* found = find(name);
+    if (found == nullptr) throw std::logic_error("no control " + name);
+    return found;
+}
+
+bool ProgramFixture::isShown(const std::string& window) {
+    const QWidget* found = find(window);
+    return found != nullptr && found->isVisible();
+}
+
+std::string ProgramFixture::text(const std::string& name) {
+    QWidget* found = control(name);
+    if (const auto* label = qobject_cast<QLabel*>(found)) return label->text().toStdString();
+    if (const auto* box = qobject_cast<QLineEdit*>(found)) return box->text().toStdString();
+    if (const auto* button = qobject_cast<QAbstractButton*>(found)) {
+        return button->text().toStdString();
+    }
+    throw std::logic_error("no text on " + name);
+}
+
+std::string ProgramFixture::letters(const std::string& tiles) {
+    std::string all;
+    for (int k = 0; k < CubeCount; ++k) {
+        const QString letter = control(tiles + std::to_string(k))->accessibleName();
+        all += letter.isEmpty() ? "." : letter.toStdString();
+    }
+    return all;
+}
+
+Words ProgramFixture::words(const std::string& list) {
+    const QAbstractItemModel& model = *view(list).model();
+    Words all;
+    for (int row = 0; row < model.rowCount(); ++row) {
+        all.push_back(model.index(row, 0).data().toString().toStdString());
+    }
+    return all;
+}
+
+Words ProgramFixture::struck() {
+    const QAbstractItemModel& model = *view("WordList").model();
+    Words all;
+    for (int row = 0; row < model.rowCount(); ++row) {
+        const QModelIndex cell = model.index(row, 0);
+        if (cell.data(Qt::FontRole).value<QFont>().strikeOut()) {
+            all.push_back(cell.data().toString().toStdString());
+        }
+    }
+    return all;
+}
+
+QAbstractItemView& ProgramFixture::view(const std::string& list) {
+    auto* found = qobject_cast<QAbstractItemView*>(control(list));
+    if (found == nullptr) throw std::logic_error("no list " + list);
+    return *found;
+}
+
+Tiles ProgramFixture::lit(const std::string& tiles) {
+    Tiles found;
+    for (int k = 0; k < CubeCount; ++k) {
+        if (control(tiles + std::to_string(k))->property("selected").toBool()) found.push_back(k);
+    }
+    return found;
+}

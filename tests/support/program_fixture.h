@@ -1,0 +1,69 @@
+#pragma once
+// The real program, offscreen, used as a player uses it: keys go where the focus
+// is, mouse clicks to whatever is on top. Controls go by their names, those of the
+// main window first; "Results/ResultsOK" is the one in that window.
+#include <QWidget>
+#include <string>
+#include <vector>
+
+#include "support/box_answers.h"
+#include "support/game_fixture.h"
+
+class QAbstractItemView;
+class QTimer;
+
+using Tiles = std::vector<int>;
+using Words = std::vector<std::string>;
+
+class ProgramFixture : public GameFixture {
+  protected:
+    ~ProgramFixture() override;
+
+    /// Starts the program and shows its main window, in front.
+    /// From then on the clock fires only when the test says so.
+    void launch();
+
+    // What the player does.
+    void start(const std::string& board);   ///< presses Start
+    void press(const std::string& button);  ///< by mouse
+    void type(const std::string& text);     ///< key by key
+    void key(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
+    void paste(const std::string& text);
+    void click(int tile, Qt::MouseButton button = Qt::LeftButton);
+    void clickTiles(const Tiles& tiles);
+    void doubleClick(int tile);
+    void select(const std::string& list, const std::string& word);  ///< by mouse
+    void bringToFront(const std::string& window);
+    void closeByTitleBar(const std::string& window);
+    void tick(int times = 1);  ///< the clock fires, if it runs
+
+    // What the player sees.
+    QWidget* control(const std::string& name);  ///< fails the test when missing
+    bool isShown(const std::string& window);
+    std::string text(const std::string& control);  ///< of a label, box or button
+    std::string typed() { return text("NewWord"); }
+    Tiles litTiles() { return lit("Cube"); }
+    Tiles litResults() { return lit("ResultCubes"); }
+    std::string letters(const std::string& tiles = "Cube");  ///< blank tiles: "."
+    Words words(const std::string& list = "WordList");
+    Words struck();  ///< words struck through
+    int warnings() { return warnings_; }
+
+    BoxAnswers boxes_;
+
+  private:
+    static void clickOn(const QWidget& widget, const QPoint& place, Qt::MouseButton button);
+    QWidget* find(const std::string& name);
+    QTimer& clock();
+    QAbstractItemView& view(const std::string& list);
+    Tiles lit(const std::string& tiles);
+};
+
+/// The program in front, on a small dictionary.
+class PlayedBoard : public ProgramFixture {
+  protected:
+    PlayedBoard() {
+        makeDictionary({"bone", "cast", "cat", "cats", "coat", "ten", "toe", "tone", "won"});
+        launch();
+    }
+};
