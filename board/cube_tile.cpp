@@ -1,5 +1,6 @@
 #include "board/cube_tile.h"
 
+#include <QAccessible>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QVariant>
@@ -16,7 +17,15 @@ void CubeTile::draw(bool selected, const QString& letter) {
     letter_ = letter;
     setProperty("selected", selected);
     setAccessibleName(letter);
+    if (QAccessible::isActive()) tellLit();
     repaint();
+}
+
+void CubeTile::tellLit() {
+    QAccessible::State changed;
+    changed.checked = true;
+    QAccessibleStateChangeEvent event(this, changed);
+    QAccessible::updateAccessibility(&event);
 }
 
 // The screen's resolution and the palette may change under a tile, so both are

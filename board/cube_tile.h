@@ -29,6 +29,8 @@ class CubeTile : public QWidget {
     void mouseDoubleClickEvent(QMouseEvent* event) override;
 
   private:
+    void tellLit();
+
     bool selected_ = false;
     bool pressed_ = false;
     QString letter_;

@@ -12,6 +12,7 @@
 #include <QToolButton>
 
 #include "board/cube_tile.h"
+#include "board/tile_accessible.h"
 #include "board/tile_picture.h"
 #include "entry/submission.h"
 #include "entry/word_entry.h"
@@ -76,13 +77,13 @@ void Main::load() {
 void Main::makeToolBar() {
     ToolBar = new QWidget(this);
     SetUp(ToolBar, "ToolBar", {0, 0, ClientWidth, ToolBarHeight}, MainFont());
-    Start = makeToolButton("Start", 0, "Start game");
-    Pause = makeToolButton("Pause", 480, "Pause game");
-    End = makeToolButton("End", 960, "End game");
-    Options = makeToolButton("Options", 1800, "Options");
-    Dictionary = makeToolButton("Dictionary", 2280, "Dictionary editor");
-    HelpButton = makeToolButton("HelpButton", 3120, "");
-    Exit = makeToolButton("Exit", 3960, "Exit game");
+    Start = makeToolButton("Start", 0, "Start game", Qt::Key_S);
+    Pause = makeToolButton("Pause", 480, "Pause game", Qt::Key_P);
+    End = makeToolButton("End", 960, "End game", Qt::Key_E);
+    Options = makeToolButton("Options", 1800, "Options", Qt::Key_O);
+    Dictionary = makeToolButton("Dictionary", 2280, "Dictionary editor", Qt::Key_D);
+    HelpButton = makeToolButton("HelpButton", 3120, "", Qt::Key_H);
+    Exit = makeToolButton("Exit", 3960, "Exit game", Qt::Key_X);
     HelpButton->setText("?");
     HelpButton->setAccessibleName("Help");
     connect(Start, &QToolButton::clicked, this, [] { Common::StartGame(); });
@@ -92,12 +93,13 @@ void Main::makeToolBar() {
     connect(Exit, &QToolButton::clicked, this, [] { Common::ExitProgram(); });
 }
 
-QToolButton* Main::makeToolButton(const char* name, int left, const char* toolTip) {
+QToolButton* Main::makeToolButton(const char* name, int left, const char* toolTip, Qt::Key altKey) {
     auto* button = new QToolButton(ToolBar);
     SetUp(button, name, {left, 15, ToolButtonWidth, ToolButtonHeight}, MainFont());
     button->setToolTip(toolTip);
     button->setAccessibleName(toolTip);
     button->setIconSize({ToolPictureSize, ToolPictureSize});
+    button->setShortcut(Qt::ALT | altKey);
     button->setFocusPolicy(Qt::TabFocus);
     return button;
 }
@@ -112,6 +114,7 @@ void Main::setPictures() {
 }
 
 void Main::makeBoard() {
+    MakeTilesAccessible();
     CubeFrame = new QFrame(this);
     SetUp(CubeFrame, "CubeFrame", {120, 480, 5775, 6015}, MainFont());
     for (int k = 0; k < 16; ++k) {
@@ -120,6 +123,7 @@ void Main::makeBoard() {
         SetUp(tile, name.constData(),
               {TilePitch * (k % 4), FirstTileTop + TilePitch * (k / 4), TileSide, TileSide},
               LayoutFont(Typeface::Courier, 48));
+        tile->setAccessibleDescription(QString("Row %1, column %2").arg(k / 4 + 1).arg(k % 4 + 1));
         connect(tile, &CubeTile::clicked, this,
                 [k] { Common::CubeClick(static_cast<std::int16_t>(k)); });
         connect(tile, &CubeTile::doubleClicked, this,
@@ -143,6 +147,7 @@ void Main::makeWordEntry() {
     Clear = new QPushButton("Clear", this);
     SetUp(Clear, "Clear", {5040, 6960, 855, 615}, SmallerFont());
     Clear->setFocusPolicy(Qt::TabFocus);
+    Clear->setShortcut(Qt::ALT | Qt::Key_C);
     connect(Clear, &QPushButton::clicked, this, [] { Common::ClearLetter(); });
 }
 

@@ -53,6 +53,6 @@ class Main : public QWidget {
     void makeWordEntry();
     void makeLabels();
     void makeWordList();
-    QToolButton* makeToolButton(const char* name, int left, const char* toolTip);
+    QToolButton* makeToolButton(const char* name, int left, const char* toolTip, Qt::Key altKey);
     void setPictures();
 };

@@ -18,6 +18,7 @@ void AddWord(QListWidget& list, const QString& word) {
     const int room = list.width() - 2 * list.frameWidth() - CellPadding;
     const QFont fitting = Condensed(list.font(), word, room);
     if (fitting != list.font()) item->setFont(fitting);
+    if (fitting.strikeOut()) item->setData(Qt::AccessibleDescriptionRole, "not in dictionary");
     list.addItem(item);
 }
 
@@ -59,4 +60,5 @@ void LightResultCube(QLabel& cube, bool lit) {
     palette.setColor(QPalette::Window, lit ? LitColour : PlainColour);
     cube.setPalette(palette);
     cube.setProperty("selected", lit);
+    cube.setAccessibleDescription(lit ? "lit" : "");
 }

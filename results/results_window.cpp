@@ -103,6 +103,9 @@ void Results::makeButtons() {
     Colour(RemoveFromDict, QColor(255, 128, 128));
     AddToDict->setAccessibleName("Add to dictionary");
     RemoveFromDict->setAccessibleName("Remove from dictionary");
+    ResultsOK->setShortcut(Qt::ALT | Qt::Key_O);
+    AddToDict->setShortcut(Qt::ALT | Qt::Key_A);
+    RemoveFromDict->setShortcut(Qt::ALT | Qt::Key_R);
     connect(ResultsOK, &QPushButton::clicked, this, [] { Common::CloseResults(); });
     connect(AddToDict, &QPushButton::clicked, this, [] { Common::AcceptBadWord(); });
     connect(RemoveFromDict, &QPushButton::clicked, this, [] { Common::RejectDictWord(); });
