@@ -12,12 +12,12 @@
 
 namespace {
 
-std::array<int, 2> pipeEnds{-1, -1};
+std::array<int, 2> PipeEnds{-1, -1};
 
 // A handler may do little more than write; the event loop does the rest.
 void NoteSignal(int signal) {
     const auto number = static_cast<char>(signal);
-    [[maybe_unused]] const auto written = write(pipeEnds[1], &number, 1);
+    [[maybe_unused]] const auto written = write(PipeEnds[1], &number, 1);
 }
 
 void EndBySignal(int signal) {
@@ -26,11 +26,11 @@ void EndBySignal(int signal) {
 }
 
 void FollowSignals(const std::function<void()>& close) {
-    if (pipe2(pipeEnds.data(), O_CLOEXEC | O_NONBLOCK) != 0) return;
-    auto* notifier = new QSocketNotifier(pipeEnds[0], QSocketNotifier::Read, qApp);
+    if (pipe2(PipeEnds.data(), O_CLOEXEC | O_NONBLOCK) != 0) return;
+    auto* notifier = new QSocketNotifier(PipeEnds[0], QSocketNotifier::Read, qApp);
     QObject::connect(notifier, &QSocketNotifier::activated, qApp, [close] {
         char signal = 0;
-        if (read(pipeEnds[0], &signal, 1) != 1) return;
+        if (read(PipeEnds[0], &signal, 1) != 1) return;
         if (QApplication::activeModalWidget() != nullptr) EndBySignal(signal);
         close();
     });

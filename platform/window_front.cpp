@@ -14,15 +14,15 @@ namespace {
 constexpr std::array Names{"Main",     "OptionsDialog", "Results", "DictionaryEditor",
                            "Progress", "HelpBrowser"};
 
-QList<QPointer<QWidget>> followed;  // latest in front first
+QList<QPointer<QWidget>> Followed;  // latest in front first
 
 class ActivationFilter : public QObject {
   public:
     bool eventFilter(QObject* receiver, QEvent* event) override {
         if (event->type() != QEvent::WindowActivate) return false;
         auto* window = static_cast<QWidget*>(receiver);
-        followed.removeAll(window);
-        followed.prepend(window);
+        Followed.removeAll(window);
+        Followed.prepend(window);
         return false;
     }
 };
@@ -46,8 +46,8 @@ namespace WindowFront {
 void Follow(QWidget* window) {
     static ActivationFilter filter;
     window->installEventFilter(&filter);
-    followed.removeAll(nullptr);
-    followed.append(window);
+    Followed.removeAll(nullptr);
+    Followed.append(window);
 }
 
 void Bring(QWidget& window) {
@@ -71,8 +71,8 @@ void GiveBack() {
 }
 
 QWidget* Latest() {
-    const auto found = std::find_if(followed.begin(), followed.end(), CanBeInFront);
-    return found == followed.end() ? nullptr : found->data();
+    const auto found = std::find_if(Followed.begin(), Followed.end(), CanBeInFront);
+    return found == Followed.end() ? nullptr : found->data();
 }
 
 std::int32_t Number() {
