@@ -167,5 +167,6 @@ void Results::placeBeside(const QWidget& window) {
 // makes it anew.
 void Results::closeEvent(QCloseEvent* event) {
     event->accept();
+    WindowFront::Hide(*this);
     Windows::Discard<Results>();
 }
