@@ -14,6 +14,7 @@
 #include "board/cube_tile.h"
 #include "board/tile_accessible.h"
 #include "board/tile_picture.h"
+#include "dictionary/editor_commands.h"
 #include "entry/submission.h"
 #include "entry/word_entry.h"
 #include "game/game_flow.h"
@@ -21,6 +22,7 @@
 #include "game/start_up.h"
 #include "game/toolbar_pictures.h"
 #include "help/help_commands.h"
+#include "options/options_commands.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
 
@@ -89,6 +91,8 @@ void Main::makeToolBar() {
     connect(Start, &QToolButton::clicked, this, [] { Common::StartGame(); });
     connect(Pause, &QToolButton::clicked, this, [] { Common::PauseGame(); });
     connect(End, &QToolButton::clicked, this, [] { Common::StopGame(); });
+    connect(Options, &QToolButton::clicked, this, [] { Common::ShowOptions(); });
+    connect(Dictionary, &QToolButton::clicked, this, [] { ::Dictionary::OpenEditor(); });
     connect(HelpButton, &QToolButton::clicked, this, [] { Common::OpenHelp(); });
     connect(Exit, &QToolButton::clicked, this, [] { Common::ExitProgram(); });
 }

@@ -3,11 +3,15 @@
 #include <quorle/word_engine.h>
 
 #include "dictionary/dictionary.h"
+#include "dictionary/editor_window.h"
+#include "dictionary/merge.h"
+#include "dictionary/progress_window.h"
 #include "game/game_state.h"
 #include "game/main_window.h"
 #include "game/settings.h"
 #include "game/windows.h"
 #include "help/help_window.h"
+#include "options/options_window.h"
 #include "platform/platform.h"
 #include "results/results_window.h"
 
@@ -36,9 +40,13 @@ void CloseIfOpen() {
 namespace Common {
 
 void ExitProgram() {
+    Dictionary::StopMerge();  // timers run under the question, too
     OfferDictionarySave();
+    CloseIfOpen<Progress>();
+    CloseIfOpen<OptionsDialog>();
     CloseIfOpen<Results>();
     CloseIfOpen<HelpBrowser>();
+    CloseIfOpen<DictionaryEditor>();
     Windows::Shared<Main>().close();
 }
 

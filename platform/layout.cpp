@@ -5,6 +5,7 @@
 #include <QFontMetrics>
 #include <QKeyEvent>
 #include <QLabel>
+#include <QMenuBar>
 #include <QVariant>
 #include <cmath>
 
@@ -45,6 +46,7 @@ class ReturnKeys : public QObject {
         if (event->type() != QEvent::KeyPress || !receiver->isWidgetType()) return false;
         const auto* key = static_cast<QKeyEvent*>(event);
         if (key->key() != Qt::Key_Return && key->key() != Qt::Key_Enter) return false;
+        if (qobject_cast<QMenuBar*>(receiver) != nullptr) return false;  // opens a menu
         if ((key->modifiers() & ~Qt::KeypadModifier) != Qt::NoModifier) return false;
         const QWidget* window = static_cast<QWidget*>(receiver)->window();
         auto* button = window->property(DefaultButtonProperty).value<QAbstractButton*>();

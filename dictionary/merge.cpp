@@ -1,0 +1,83 @@
+#include "dictionary/merge.h"
+
+#include <quorle/word_engine.h>
+
+#include <QLabel>
+#include <QTimer>
+
+#include "dictionary/editor_window.h"
+#include "dictionary/listing.h"
+#include "dictionary/progress_window.h"
+#include "game/game_state.h"
+#include "game/windows.h"
+#include "platform/layout.h"
+#include "platform/platform.h"
+
+namespace {
+
+constexpr std::int32_t Complete = 100;
+constexpr const char* NextStep = "dummy";
+
+void SetBarWidth(QLabel& bar, double twips) {
+    bar.resize(Twips(qRound(twips)), bar.height());
+}
+
+void ShowProgress(Progress& window, std::int32_t percent) {
+    SetBarWidth(*window.ProgressIndicator, State.ProgressFullWidth * percent / 100.0);
+    window.repaint();
+}
+
+void ShowProgressWindow(Progress& window) {
+    window.ProgressLabel->setText("Merging words...");
+    window.Display();
+    if (State.ProgressFullWidth == 0) {
+        const int width = window.ProgressIndicator->width() * TwipsPerPixel;
+        State.ProgressFullWidth = static_cast<std::int16_t>(width);
+    }
+}
+
+void FinishMerge(Progress& window) {
+    SetBarWidth(*window.ProgressIndicator, 0);
+    Dictionary::ListStartingLetters(True);
+    window.HideDisplay();
+    Dictionary::ShowEditor();
+    Dictionary::ListWords();
+    State.DictionaryChanged = True;
+}
+
+}  // namespace
+
+namespace Dictionary {
+
+void StartMerge() {
+    const std::string path = Platform::ChooseFileToOpen(Platform::ProgramFolder());
+    if (path.empty()) return;
+    const std::int32_t percent = cReadTextFile(path.c_str());
+    if (percent >= Complete) {
+        ListStartingLetters(True);
+        ListWords();
+        State.DictionaryChanged = True;
+        return;
+    }
+    WindowFront::Hide(Windows::Shared<DictionaryEditor>());
+    Progress& window = Windows::Shared<Progress>();
+    ShowProgressWindow(window);
+    ShowProgress(window, percent);
+    window.DictionaryTimer->start();
+}
+
+void MergeStep() {
+    Progress& window = Windows::Shared<Progress>();
+    window.DictionaryTimer->stop();
+    const std::int32_t percent = cReadTextFile(NextStep);
+    if (percent >= Complete) return FinishMerge(window);
+    ShowProgress(window, percent);
+    window.DictionaryTimer->start();
+}
+
+void StopMerge() {
+    if (Windows::Existing<Progress> != nullptr)
+        Windows::Existing<Progress>->DictionaryTimer->stop();
+}
+
+}  // namespace Dictionary

@@ -1,0 +1,49 @@
+#include "dictionary/progress_window.h"
+
+#include <QLabel>
+#include <QTimer>
+
+#include "dictionary/merge.h"
+#include "game/main_window.h"
+#include "game/windows.h"
+#include "platform/layout.h"
+
+namespace {
+
+constexpr int ClientWidth = 4200;
+constexpr int ClientHeight = 900;
+constexpr int StepInterval = 10;  // milliseconds
+const QColor BarColour(0, 0, 192);
+
+}  // namespace
+
+Progress::Progress() {
+    setObjectName("Progress");
+    setWindowTitle("Quorle Progress");
+    setWindowFlags(Qt::Window | Qt::FramelessWindowHint | Qt::WindowDoesNotAcceptFocus);
+    setAttribute(Qt::WA_ShowWithoutActivating);
+    setFixedSize(Twips(ClientWidth), Twips(ClientHeight));
+    setFrameStyle(QFrame::Box | QFrame::Plain);
+    ProgressLabel = MakeLabel(this, "ProgressLabel", {480, 120, 3255, 375},
+                              LayoutFont(Typeface::SansSerif, 13.5));
+    ProgressIndicator = MakeLabel(this, "ProgressIndicator", {120, 600, 3975, 135}, PlainFont());
+    QPalette colours = ProgressIndicator->palette();
+    colours.setColor(QPalette::Window, BarColour);
+    ProgressIndicator->setPalette(colours);
+    ProgressIndicator->setAutoFillBackground(true);
+    DictionaryTimer = new QTimer(this);
+    DictionaryTimer->setObjectName("DictionaryTimer");
+    DictionaryTimer->setInterval(StepInterval);
+    connect(DictionaryTimer, &QTimer::timeout, this, [] { Dictionary::MergeStep(); });
+}
+
+void Progress::Display() {
+    const QRect main = Windows::Shared<Main>().frameGeometry();
+    move(main.center() - rect().center());
+    show();
+    raise();
+}
+
+void Progress::HideDisplay() {
+    hide();
+}
