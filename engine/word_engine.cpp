@@ -1,1 +1,259 @@
 #include "quorle/word_engine.h"
+
+#include <string.h>
+
+#include <algorithm>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "board_search.h"
+#include "current_dictionary.h"
+#include "damaged_file.h"
+#include "dictionary_file.h"
+#include "read_file.h"
+#include "replace_file.h"
+#include "settings_file.h"
+#include "word_cursor.h"
+#include "word_file_export.h"
+#include "word_reader.h"
+
+// The flat interface: checks what callers pass, and lets no exception out.
+
+namespace {
+
+WordCursor Listing;
+
+struct LastSearch {
+    std::optional<BoardSearch> search;  // made by the first search
+    WordReader reader;
+    std::vector<std::uint32_t> found;
+};
+
+LastSearch Found;
+
+/// Runs `work`; `nothing` when memory runs out.
+template <class Result, class Work>
+Result Guarded(Result nothing, const Work& work) {
+    try {
+        return work();
+    } catch (...) {
+        return nothing;
+    }
+}
+
+bool IsLetters(std::string_view text) {
+    return std::all_of(text.begin(), text.end(), [](char c) { return c >= 'a' && c <= 'z'; });
+}
+
+/// At most 17 characters, so that a text without end is not read.
+std::string_view Beginning(const char* text) {
+    return {text, ::strnlen(text, LongestWord + 1)};
+}
+
+bool IsWord(std::string_view text) {
+    return text.size() >= ShortestWordSize && text.size() <= LongestWordSize && IsLetters(text);
+}
+
+bool IsWordSize(std::int32_t size) {
+    return size >= ShortestWordSize && size <= LongestWordSize;
+}
+
+bool IsPrefix(std::int32_t first, std::int32_t second) {
+    return first >= 0 && first < Letters && second >= 0 && second < Letters;
+}
+
+std::array<char, 2> Prefix(std::int32_t first, std::int32_t second) {
+    return {static_cast<char>('a' + first), static_cast<char>('a' + second)};
+}
+
+bool LoadDictionary(const char* path) {
+    std::vector<std::byte> bytes;
+    DictionaryContent content;
+    if (!ReadRegularFile(path, bytes) || !DecodeDictionary(bytes, content)) {
+        RememberDamaged(path);
+        return false;
+    }
+    ForgetDamaged(path);
+    TheDictionary.words = std::move(content.words);
+    TheDictionary.maxWordSize = content.maxWordSize;
+    return true;
+}
+
+/// The words of at most `longest` letters.
+WordGraph ReducedTo(const WordGraph& words, std::size_t longest) {
+    GraphBuilder builder;
+    WordCursor cursor(words);
+    for (std::string_view word; cursor.next(word);) {
+        if (word.size() <= longest) builder.add(word);
+    }
+    return builder.finish();
+}
+
+/// Words found on a board that is 16 letters.
+void SearchBoard(std::string_view letters) {
+    Board board{};
+    for (std::size_t i = 0; i < board.size(); ++i) {
+        board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
+    }
+    if (!Found.search) Found.search.emplace();
+    Found.found = Found.search->search(TheDictionary.words, board,
+                                       {TheDictionary.minWordSize, TheDictionary.maxWordSize});
+    Found.reader = WordReader(TheDictionary.words);
+}
+
+}  // namespace
+
+int32_t cReadBinaryDictionary(const char* path) {
+    return Guarded(0, [&] { return path != nullptr && LoadDictionary(path) ? 1 : 0; });
+}
+
+int32_t cWriteBinaryDictionary(const char* path) {
+    return Guarded(0, [&] {
+        if (path == nullptr) return 0;
+        const auto bytes = EncodeDictionary({TheDictionary.words, TheDictionary.maxWordSize});
+        return ReplaceFile(path, bytes) ? 1 : 0;
+    });
+}
+
+int32_t cDictionaryCheck(char* word, int32_t* found, int32_t* other) {
+    if (found == nullptr || other == nullptr) return 0;
+    *found = *other = 0;
+    if (word == nullptr) return 0;
+    const std::string_view letters = Beginning(word);
+    GraphPlace place{};
+    if (letters.empty() || letters.size() > LongestWord || !IsLetters(letters) ||
+        !TheDictionary.words.find(letters, place)) {
+        return 0;
+    }
+    *other = 1;
+    *found = place.isWord ? 1 : 0;
+    return *found;
+}
+
+int32_t cDictionaryAdd(const char* word) {
+    return Guarded(0, [&] {
+        if (word == nullptr) return 0;
+        const std::string_view letters = Beginning(word);
+        const auto longest = static_cast<std::size_t>(TheDictionary.maxWordSize);
+        if (!IsWord(letters) || letters.size() > longest) return 0;
+        TheDictionary.words.add(letters);
+        return 1;
+    });
+}
+
+int32_t cDictionaryRemove(const char* word) {
+    return Guarded(0, [&] {
+        if (word == nullptr || !IsWord(Beginning(word))) return 0;
+        return TheDictionary.words.remove(Beginning(word)) ? 1 : 0;
+    });
+}
+
+int32_t cDictionaryClear(void) {
+    TheDictionary.words = WordGraph();
+    return 1;
+}
+
+int32_t cNumberOfWords(void) {
+    return static_cast<int32_t>(TheDictionary.words.size());
+}
+
+int32_t cDictIndex(int32_t first, int32_t second) {
+    if (!IsPrefix(first, second)) return -1;
+    const auto prefix = Prefix(first, second);
+    return static_cast<int32_t>(TheDictionary.words.firstIndex({prefix.data(), prefix.size()}));
+}
+
+int32_t cStartDecodingWords(int32_t first, int32_t second) {
+    if (!IsPrefix(first, second)) return 0;
+    const auto prefix = Prefix(first, second);
+    Listing = WordCursor(TheDictionary.words, {prefix.data(), prefix.size()});
+    return 1;
+}
+
+int16_t cDecodeNextWord(char* buffer) {
+    std::string_view word;
+    if (buffer == nullptr || !Listing.next(word)) return 0;
+    std::copy(word.begin(), word.end(), buffer);
+    return static_cast<int16_t>(word.size());
+}
+
+int32_t cWriteTextFile(const char* path) {
+    return Guarded(0, [&] { return path != nullptr && ExportWords(path) ? 1 : 0; });
+}
+
+int32_t cCheckForAllDefinedWords(const char* board) {
+    Found.found.clear();
+    return Guarded(0, [&] {
+        if (board == nullptr || Beginning(board).size() != Cubes || !IsLetters(Beginning(board))) {
+            return 0;
+        }
+        SearchBoard(Beginning(board));
+        return static_cast<int32_t>(Found.found.size());
+    });
+}
+
+int32_t cGetDefinedWord(int32_t i, char* buffer, int32_t* n) {
+    if (n == nullptr) return 0;
+    *n = 0;
+    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= Found.found.size()) return 0;
+    const std::string_view word = Found.reader.word(Found.found[static_cast<std::size_t>(i)]);
+    std::copy(word.begin(), word.end(), buffer);
+    *n = static_cast<int32_t>(word.size());
+    return 1;
+}
+
+int32_t cMinWordSize(void) {
+    return TheDictionary.minWordSize;
+}
+int32_t cMaxWordSize(void) {
+    return TheDictionary.maxWordSize;
+}
+
+int32_t cSetMinWordSize(int32_t size) {
+    if (!IsWordSize(size)) return 0;
+    TheDictionary.minWordSize = size;
+    return 1;
+}
+
+int32_t cSetMaxWordSize(int32_t size) {
+    if (!IsWordSize(size)) return 0;
+    TheDictionary.maxWordSize = size;
+    return 1;
+}
+
+int32_t cReduceWordSize(void) {
+    return Guarded(0, [&] {
+        TheDictionary.words =
+            ReducedTo(TheDictionary.words, static_cast<std::size_t>(TheDictionary.maxWordSize));
+        return 1;
+    });
+}
+
+int32_t cGetRegValue(const char* key, const char* name, char* buffer, int32_t* n) {
+    if (n == nullptr) return 0;
+    const std::int32_t room = *n;
+    *n = 0;
+    return Guarded(0, [&] {
+        std::string value;
+        if (key == nullptr || name == nullptr || buffer == nullptr || room < 0 ||
+            !GetSetting(key, name, value) || value.size() > static_cast<std::size_t>(room)) {
+            return 0;
+        }
+        std::copy(value.begin(), value.end(), buffer);
+        *n = static_cast<int32_t>(value.size());
+        return 1;
+    });
+}
+
+int32_t cSetRegValue(const char* key, const char* name, const char* text, int32_t length) {
+    return Guarded(0, [&] {
+        if (key == nullptr || name == nullptr || text == nullptr || length < 0) return 0;
+        return SetSetting(key, name, {text, static_cast<std::size_t>(length)}) ? 1 : 0;
+    });
+}
+
+// Until the merge of word files is there, nothing steps.
+int32_t cReadTextFile(const char*) {
+    return 100;
+}

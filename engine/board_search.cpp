@@ -1,0 +1,185 @@
+#include "board_search.h"
+
+#include <algorithm>
+#include <bit>
+
+#include "letter_match.h"
+#include "rank_set.h"
+
+// All chains of one length are extended together, so that their nodes are fetched side by side and
+// the inner loop runs long. When there are very many, they are taken in blocks, and each block's
+// longer chains first: so memory is bounded whatever the board.
+//
+// A chain carries the index of the first word below its node. A word found is marked by its index:
+// one found along many chains is marked once, and the marks are in alphabetical order.
+
+namespace {
+
+constexpr std::size_t Block = 512;       // chains extended together
+constexpr std::size_t MostTouching = 8;  // cubes around a cube
+constexpr std::uint8_t NoCube = Cubes;   // where the empty chain ends; every cube touches it
+constexpr std::uint32_t QBit = 1U << ('q' - 'a');
+constexpr std::uint32_t UBit = 1U << ('u' - 'a');
+
+/// Cubes joined to a beginning of words. Same cubes in another order are another chain only if the
+/// letters differ or the last cube does.
+struct Chain {
+    NodeIndex node;
+    std::uint32_t firstWord;  // index of the first word below the node
+    std::uint16_t used;       // bit i: cube i is in the chain
+    std::uint8_t cube;        // the last one
+    std::uint8_t letters;
+};
+
+constexpr std::array<std::uint16_t, Cubes + 1> MakeTouching() {
+    std::array<std::uint16_t, Cubes + 1> touching{};
+    for (int a = 0; a < Cubes; ++a) {
+        for (int b = 0; b < Cubes; ++b) {
+            const int rows = a / 4 - b / 4;
+            const int columns = a % 4 - b % 4;
+            const bool near = rows * rows <= 1 && columns * columns <= 1 && a != b;
+            if (near) touching[a] = static_cast<std::uint16_t>(touching[a] | (1 << b));
+        }
+    }
+    touching[NoCube] = 0xffff;
+    return touching;
+}
+
+constexpr auto Touching = MakeTouching();
+
+struct Level {
+    std::array<Chain, Block * MostTouching> chains;
+    std::size_t count;
+};
+
+}  // namespace
+
+struct BoardSearch::State {
+    // Level i: chains of i cubes that wait to be extended. The last is never reached.
+    std::array<Level, Cubes + 2> levels;
+    CubeBits cubes;
+    RankSet found;
+    std::vector<std::uint32_t> ranks;
+    const std::uint32_t* nodes;
+    std::uint32_t minLetters;
+    std::uint32_t maxLetters;
+
+    template <class Match>
+    void extend(const Match& match, const Chain& chain, Level& longer);
+    template <class Match>
+    void run();
+    void mark(std::uint32_t rank, std::uint32_t letters) {
+        if (letters >= minLetters && letters <= maxLetters) found.insert(rank);
+    }
+};
+
+template <class Match>
+inline void BoardSearch::State::extend(const Match& match, const Chain& chain, Level& longer) {
+    const std::uint32_t* node = nodes + chain.node;
+    std::uint32_t next = match(node[0]) & Touching[chain.cube] & ~std::uint32_t{chain.used};
+    for (; next != 0; next &= next - 1) {
+        const auto cube = static_cast<std::uint32_t>(std::countr_zero(next));
+        const std::uint32_t bit = cubes[cube];
+        const std::uint32_t* edge = node + LinkOffset(node[0], bit);
+        std::uint32_t letters = chain.letters + 1U;
+        std::uint32_t firstWord = chain.firstWord + edge[1];
+        if ((edge[0] & WordEnds) != 0) mark(firstWord++, letters);
+        NodeIndex child = ChildOf(edge[0]);
+        if (bit == QBit) {
+            // Past a Qu cube a word goes on with its "u" or not at all.
+            const std::uint32_t* afterQ = nodes + child;
+            if ((afterQ[0] & UBit) == 0) continue;
+            edge = afterQ + LinkOffset(afterQ[0], UBit);
+            ++letters;
+            firstWord += edge[1];
+            if ((edge[0] & WordEnds) != 0) mark(firstWord++, letters);
+            child = ChildOf(edge[0]);
+        }
+        if (child == NoNode || letters >= maxLetters) continue;
+        longer.chains[longer.count++] = {
+            child, firstWord, static_cast<std::uint16_t>(chain.used | (1U << cube)),
+            static_cast<std::uint8_t>(cube), static_cast<std::uint8_t>(letters)};
+    }
+}
+
+template <class Match>
+inline void BoardSearch::State::run() {
+    const Match match(cubes);
+    std::size_t length = 0;
+    while (true) {
+        Level& level = levels[length];
+        if (level.count == 0) {
+            if (length == 0) return;
+            --length;
+            continue;
+        }
+        const std::size_t end = level.count;
+        level.count -= std::min(end, Block);
+        for (std::size_t i = level.count; i < end; ++i) {
+            extend(match, level.chains[i], levels[length + 1]);
+        }
+        ++length;
+    }
+}
+
+namespace {
+
+#if defined(__x86_64__)
+template <class State>
+[[gnu::target("avx2,bmi,popcnt"), gnu::flatten]] void RunAvx2(State& state) {
+    state.template run<Avx2Match>();
+}
+template <class State>
+[[gnu::target("avx512f,avx2,bmi,popcnt"), gnu::flatten]] void RunAvx512(State& state) {
+    state.template run<Avx512Match>();
+}
+#endif
+
+}  // namespace
+
+bool CanMatch(Matching matching) {
+#if defined(__x86_64__)
+    const bool bits = __builtin_cpu_supports("bmi") && __builtin_cpu_supports("popcnt");
+    const bool avx2 = bits && __builtin_cpu_supports("avx2");
+    if (matching == Matching::Avx2) return avx2;
+    if (matching == Matching::Avx512) return avx2 && __builtin_cpu_supports("avx512f");
+#endif
+    return matching == Matching::Plain;
+}
+
+Matching BestMatching() {
+    if (CanMatch(Matching::Avx512)) return Matching::Avx512;
+    return CanMatch(Matching::Avx2) ? Matching::Avx2 : Matching::Plain;
+}
+
+BoardSearch::BoardSearch(Matching matching) : matching_(matching), state_(new State) {
+    for (Level& level : state_->levels) level.count = 0;
+}
+
+BoardSearch::~BoardSearch() = default;
+
+const std::vector<std::uint32_t>& BoardSearch::search(const WordGraph& graph, const Board& board,
+                                                      SearchLimits limits) {
+    State& state = *state_;
+    for (std::size_t i = 0; i < board.size(); ++i) state.cubes[i] = 1U << board[i];
+    state.found.resize(graph.size());
+    state.nodes = graph.nodes();
+    state.minLetters = static_cast<std::uint32_t>(limits.minLetters);
+    state.maxLetters = static_cast<std::uint32_t>(limits.maxLetters);
+    state.levels[0].chains[0] = {graph.root(), 0, 0, NoCube, 0};
+    state.levels[0].count = 1;
+    switch (matching_) {
+#if defined(__x86_64__)
+        case Matching::Avx512:
+            RunAvx512(state);
+            break;
+        case Matching::Avx2:
+            RunAvx2(state);
+            break;
+#endif
+        default:
+            state.run<PlainMatch>();
+    }
+    state.found.drainTo(state.ranks);
+    return state.ranks;
+}

@@ -1,0 +1,91 @@
+#include <gtest/gtest.h>
+
+#include <vector>
+
+#include "board_search.h"
+#include "graph_builder.h"
+#include "random_words.h"
+#include "word_reader.h"
+
+namespace {
+
+using Words = std::set<std::string>;
+
+/// Whether the rest of a word lies on the board, going on from `cube` (-1: anywhere). A Qu cube
+/// is "qu", or a "q" that ends the word.
+bool Lies(const std::string& board, std::string_view rest, int cube, int used) {
+    if (rest.empty()) return true;
+    for (int next = 0; next < 16; ++next) {
+        const int rows = next / 4 - cube / 4;
+        const int columns = next % 4 - cube % 4;
+        const bool touches = rows * rows <= 1 && columns * columns <= 1;
+        if ((used >> next & 1) != 0 || (cube >= 0 && !touches)) continue;
+        std::string_view face = std::string_view(board).substr(static_cast<std::size_t>(next), 1);
+        if (face == "q" && rest.size() > 1) face = "qu";
+        if (!rest.starts_with(face)) continue;
+        if (Lies(board, rest.substr(face.size()), next, used | 1 << next)) return true;
+    }
+    return false;
+}
+
+Words OnBoard(const Words& words, const std::string& board, SearchLimits limits) {
+    Words found;
+    for (const std::string& word : words) {
+        const auto size = static_cast<int>(word.size());
+        const bool counts = size >= limits.minLetters && size <= limits.maxLetters;
+        if (counts && Lies(board, word, -1, 0)) found.insert(word);
+    }
+    return found;
+}
+
+WordGraph Built(const Words& words) {
+    GraphBuilder builder;
+    for (const std::string& word : words) builder.add(word);
+    return builder.finish();
+}
+
+class BoardSearchTest : public testing::TestWithParam<Matching> {
+  protected:
+    void SetUp() override {
+        if (!CanMatch(GetParam())) GTEST_SKIP() << "not on this machine";
+        search_ = std::make_unique<BoardSearch>(GetParam());
+    }
+    Words found(const WordGraph& graph, const std::string& letters, SearchLimits limits) {
+        Board board{};
+        for (std::size_t i = 0; i < 16; ++i) board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
+        WordReader reader(graph);
+        Words words;
+        for (const std::uint32_t index : search_->search(graph, board, limits)) {
+            words.emplace_hint(words.end(), reader.word(index));
+        }
+        return words;
+    }
+    std::unique_ptr<BoardSearch> search_;
+};
+
+TEST_P(BoardSearchTest, FindsWhatTryingEveryWordFinds) {
+    for (std::uint32_t seed = 0; seed < 60; ++seed) {
+        SCOPED_TRACE("seed " + std::to_string(seed));
+        RandomWords random(seed);
+        const int letters = 3 + random.below(12);
+        Words words = random.words(2000, letters, 3 + random.below(5));
+        words.insert({"suq", "quit", "iraq", "qq", "qi", "quq", "uqu"});
+        WordGraph graph = Built(words);
+        for (int board = 0; board < 20; ++board) {
+            const std::string cubes = random.board(letters);
+            const SearchLimits limits{2 + random.below(3), 2 + random.below(15)};
+            ASSERT_EQ(found(graph, cubes, limits), OnBoard(words, cubes, limits)) << cubes;
+            for (int i = 0; i < 20; ++i) {
+                const std::string word = random.word(letters, 6);
+                if (random.below(2) == 0 ? graph.add(word) : graph.remove(word)) {
+                    if (!words.insert(word).second) words.erase(word);
+                }
+            }
+        }
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(All, BoardSearchTest,
+                         testing::Values(Matching::Plain, Matching::Avx2, Matching::Avx512));
+
+}  // namespace
