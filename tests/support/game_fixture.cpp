@@ -12,6 +12,8 @@ namespace {
 
 constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
 
+std::function<float()> desktopRandomness;
+
 void ResetEngine() {
     cDictionaryClear();
     cSetMinWordSize(3);
@@ -33,7 +35,13 @@ GameFixture::GameFixture() {
     std::filesystem::create_directory(folder_ / "program");
     State = GameState();
     ResetEngine();
+    if (!desktopRandomness) desktopRandomness = Platform::RandomNumber;
     useTestDesktop();
+}
+
+void GameFixture::useDesktopRandomness() {
+    Platform::SeedRandom();
+    Platform::RandomNumber = desktopRandomness;
 }
 
 void GameFixture::useTestDesktop() {
