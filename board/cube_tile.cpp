@@ -7,6 +7,14 @@
 
 #include "board/tile_picture.h"
 
+namespace {
+
+// The toolkit goes by time and place alone and calls two quick clicks beside a
+// border between tiles a double click on the second.
+const CubeTile* lastPressed = nullptr;
+
+}  // namespace
+
 CubeTile::CubeTile(QWidget* parent) : QWidget(parent) {
     setAttribute(Qt::WA_OpaquePaintEvent);
     setProperty("selected", false);
@@ -38,7 +46,9 @@ void CubeTile::paintEvent(QPaintEvent*) {
 }
 
 void CubeTile::mousePressEvent(QMouseEvent* event) {
-    if (event->button() == Qt::LeftButton) pressed_ = true;
+    if (event->button() != Qt::LeftButton) return;
+    pressed_ = true;
+    lastPressed = this;
 }
 
 void CubeTile::mouseReleaseEvent(QMouseEvent* event) {
@@ -49,6 +59,7 @@ void CubeTile::mouseReleaseEvent(QMouseEvent* event) {
 
 void CubeTile::mouseDoubleClickEvent(QMouseEvent* event) {
     if (event->button() != Qt::LeftButton) return;
+    if (lastPressed != this) return mousePressEvent(event);
     pressed_ = false;
     emit doubleClicked();
 }

@@ -46,10 +46,11 @@ void ProgramFixture::press(const std::string& button) {
 }
 
 void ProgramFixture::type(const std::string& text) {
-    for (const QChar letter : QString::fromStdString(text)) {
+    for (const char32_t letter : QString::fromStdString(text).toStdU32String()) {
         QWidget* focus = QApplication::focusWidget();
         if (focus == nullptr) throw std::logic_error("nothing has the focus");
-        QTest::sendKeyEvent(QTest::Click, focus, Qt::Key_unknown, QString(letter), Qt::NoModifier);
+        QTest::sendKeyEvent(QTest::Click, focus, Qt::Key_unknown, QString::fromUcs4(&letter, 1),
+                            Qt::NoModifier);
     }
 }
 
