@@ -11,7 +11,7 @@ namespace {
 
 // The toolkit goes by time and place alone and calls two quick clicks beside a
 // border between tiles a double click on the second.
-const CubeTile* lastPressed = nullptr;
+const CubeTile* LastPressed = nullptr;
 
 }  // namespace
 
@@ -48,7 +48,7 @@ void CubeTile::paintEvent(QPaintEvent*) {
 void CubeTile::mousePressEvent(QMouseEvent* event) {
     if (event->button() != Qt::LeftButton) return;
     pressed_ = true;
-    lastPressed = this;
+    LastPressed = this;
 }
 
 void CubeTile::mouseReleaseEvent(QMouseEvent* event) {
@@ -59,7 +59,7 @@ void CubeTile::mouseReleaseEvent(QMouseEvent* event) {
 
 void CubeTile::mouseDoubleClickEvent(QMouseEvent* event) {
     if (event->button() != Qt::LeftButton) return;
-    if (lastPressed != this) return mousePressEvent(event);
+    if (LastPressed != this) return mousePressEvent(event);
     pressed_ = false;
     emit doubleClicked();
 }

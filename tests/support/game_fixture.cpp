@@ -12,7 +12,7 @@ namespace {
 
 constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
 
-std::function<float()> desktopRandomness;
+std::function<float()> DesktopRandomness;
 
 void ResetEngine() {
     cDictionaryClear();
@@ -35,13 +35,13 @@ GameFixture::GameFixture() {
     std::filesystem::create_directory(folder_ / "program");
     State = GameState();
     ResetEngine();
-    if (!desktopRandomness) desktopRandomness = Platform::RandomNumber;
+    if (!DesktopRandomness) DesktopRandomness = Platform::RandomNumber;
     useTestDesktop();
 }
 
 void GameFixture::useDesktopRandomness() {
     Platform::SeedRandom();
-    Platform::RandomNumber = desktopRandomness;
+    Platform::RandomNumber = DesktopRandomness;
 }
 
 void GameFixture::useTestDesktop() {
