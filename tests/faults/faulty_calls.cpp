@@ -1,0 +1,115 @@
+#include "faulty_calls.h"
+
+#include <fcntl.h>
+#include <signal.h>
+#include <stdarg.h>
+#include <sys/stat.h>
+#include <sys/syscall.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <cerrno>
+
+namespace FaultyCalls {
+namespace {
+
+Plan Now;
+bool Armed = false;
+std::map<std::string, int> Calls;
+
+/// What is to happen at this call.
+Fault Next(const char* call) {
+    if (!Armed) return Fault::None;
+    const bool due = ++Calls[call] == Now.number && Now.call == call;
+    if (due && Now.fault == Fault::Kill) raise(SIGKILL);
+    return due ? Now.fault : Fault::None;
+}
+
+template <typename... Arguments>
+long Perform(const char* call, long number, Arguments... arguments) {
+    if (Next(call) != Fault::Error) return syscall(number, arguments...);
+    // A descriptor is gone whatever its closing says.
+    if (number == SYS_close) syscall(number, arguments...);
+    errno = Now.error;
+    return -1;
+}
+
+}  // namespace
+
+void Arm(const Plan& plan) {
+    Now = plan;
+    Calls.clear();
+    Armed = true;
+}
+
+std::map<std::string, int> Disarm() {
+    Armed = false;
+    return Calls;
+}
+
+}  // namespace FaultyCalls
+
+using namespace FaultyCalls;
+
+extern "C" {
+
+int openat(int folder, const char* path, int flags, ...) {
+    va_list rest;
+    va_start(rest, flags);
+    const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(rest, mode_t) : 0;
+    va_end(rest);
+    return static_cast<int>(Perform("openat", SYS_openat, folder, path, flags, mode));
+}
+ssize_t write(int file, const void* data, size_t size) {
+    const Fault fault = Next("write");
+    errno = Now.error;
+    if (fault == Fault::Error) return -1;
+    return syscall(SYS_write, file, data, fault == Fault::Short ? size / 2 : size);
+}
+ssize_t read(int file, void* data, size_t size) {
+    const Fault fault = Next("read");
+    errno = Now.error;
+    if (fault == Fault::Error) return -1;
+    return syscall(SYS_read, file, data, fault == Fault::Short ? std::min<size_t>(size, 1) : size);
+}
+int close(int file) {
+    return static_cast<int>(Perform("close", SYS_close, file));
+}
+int fsync(int file) {
+    return static_cast<int>(Perform("fsync", SYS_fsync, file));
+}
+int fchmod(int file, mode_t mode) {
+    return static_cast<int>(Perform("fchmod", SYS_fchmod, file, mode));
+}
+int fchown(int file, uid_t owner, gid_t group) {
+    return static_cast<int>(Perform("fchown", SYS_fchown, file, owner, group));
+}
+int flock(int file, int operation) {
+    return static_cast<int>(Perform("flock", SYS_flock, file, operation));
+}
+int fstat(int file, struct stat* status) {
+    return static_cast<int>(Perform("fstat", SYS_fstat, file, status));
+}
+int fstatat(int folder, const char* path, struct stat* status, int flags) {
+    return static_cast<int>(Perform("fstatat", SYS_newfstatat, folder, path, status, flags));
+}
+int unlinkat(int folder, const char* path, int flags) {
+    return static_cast<int>(Perform("unlinkat", SYS_unlinkat, folder, path, flags));
+}
+int linkat(int from, const char* path, int to, const char* name, int flags) {
+    if (Armed && Now.noLinks) {
+        errno = EPERM;
+        return -1;
+    }
+    return static_cast<int>(Perform("linkat", SYS_linkat, from, path, to, name, flags));
+}
+int renameat(int from, const char* path, int to, const char* name) {
+    return static_cast<int>(Perform("renameat", SYS_renameat, from, path, to, name));
+}
+ssize_t readlinkat(int folder, const char* path, char* link, size_t size) {
+    return Perform("readlinkat", SYS_readlinkat, folder, path, link, size);
+}
+int mkdir(const char* path, mode_t mode) {
+    return static_cast<int>(Perform("mkdir", SYS_mkdir, path, mode));
+}
+}
