@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "current_dictionary.h"
+
 namespace {
 
 constexpr std::size_t WordsAtOnce = 1024;
@@ -21,23 +23,29 @@ void MergedDictionary::begin() {
     ++begun_;
     added_ = 0;
     base_ = TheDictionary.words;
-    maxWordSize_ = static_cast<std::size_t>(TheDictionary.maxWordSize);
-    builder_ = GraphBuilder();
+    maxWordSize_ = TheDictionary.maxWordSize;
+    builder_ = std::make_unique<GraphBuilder>();
     cursor_ = WordCursor(base_);
     merger_ = RunMerger(file_.runs());
     nextHeld();
     nextFresh();
 }
 
+bool MergedDictionary::isUpToDate() const {
+    const WordGraph& now = TheDictionary.words;
+    return now.nodes() == base_.nodes() && now.root() == base_.root() &&
+           TheDictionary.maxWordSize == maxWordSize_;
+}
+
 void MergedDictionary::nextHeld() {
-    std::string_view word;
-    held_ = cursor_.next(word) ? Pack(word) : AtEnd;
+    const std::string_view word = cursor_.next();
+    held_ = word.empty() ? AtEnd : Pack(word);
 }
 
 void MergedDictionary::nextFresh() {
     do {
         if (!merger_.next(fresh_)) fresh_ = AtEnd;
-    } while (fresh_ != AtEnd && IsLonger(fresh_, maxWordSize_));
+    } while (fresh_ != AtEnd && IsLonger(fresh_, static_cast<std::size_t>(maxWordSize_)));
 }
 
 /// False when all words are in.
@@ -46,7 +54,7 @@ bool MergedDictionary::addWords() {
         const PackedWord word = std::min(held_, fresh_);
         if (word == AtEnd) return false;
         char letters[MaxPackedLetters];
-        builder_.add({letters, Unpack(word, letters)});
+        builder_->add({letters, Unpack(word, letters)});
         if (held_ == word) nextHeld();
         if (fresh_ == word) nextFresh();
     }
@@ -54,14 +62,12 @@ bool MergedDictionary::addWords() {
 }
 
 bool MergedDictionary::work() {
-    const bool changed = !(base_ == TheDictionary.words) ||
-                         maxWordSize_ != static_cast<std::size_t>(TheDictionary.maxWordSize);
-    if (changed) begin();
+    if (!isUpToDate()) begin();
     do {
-        if (addWords() || !builder_.finishStep()) continue;
-        TheDictionary.words = builder_.result();
+        if (addWords()) continue;
+        TheDictionary.words = builder_->finish();
         return true;
-    } while (begun_ == MaxAttempts);
+    } while (begun_ >= MaxAttempts);
     return false;
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 // Making the dictionary that holds its words and a file's, beside the one in use.
-#include "current_dictionary.h"
+#include "graph_builder.h"
+#include "word_cursor.h"
 #include "word_file_runs.h"
 
 class MergedDictionary {
@@ -9,7 +10,7 @@ class MergedDictionary {
     explicit MergedDictionary(const WordRuns& words);
 
     /// Does a piece of the work, well under a millisecond; true once the dictionary in use is the
-    /// merged one. When that is changed meanwhile all begins anew, with what it is then.
+    /// merged one. When that one has changed meanwhile all begins anew, with what it is then.
     bool work();
 
     /// The part that is done, 0..1.
@@ -17,6 +18,7 @@ class MergedDictionary {
 
   private:
     void begin();
+    bool isUpToDate() const;
     bool addWords();
     void nextHeld();
     void nextFresh();
@@ -25,8 +27,8 @@ class MergedDictionary {
     int begun_ = 0;
     std::size_t added_ = 0;
     WordGraph base_;
-    std::size_t maxWordSize_ = 0;
-    GraphBuilder builder_;
+    std::int32_t maxWordSize_ = 0;
+    std::unique_ptr<GraphBuilder> builder_;
     WordCursor cursor_;
     RunMerger merger_;
     PackedWord held_ = 0;   // the next word of the dictionary, AtEnd behind the last

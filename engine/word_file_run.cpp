@@ -2,13 +2,13 @@
 
 namespace {
 
+/// How many letters two different words have in common at their beginning, 0..15.
 std::size_t SharedLetters(PackedWord a, PackedWord b) {
     const PackedWord difference = a ^ b;
     const auto high = static_cast<std::uint64_t>(difference >> 64);
-    const auto low = static_cast<std::uint64_t>(difference);
-    return static_cast<std::size_t>(high != 0 ? std::countl_zero(high)
-                                              : 64 + std::countl_zero(low)) /
-           8;
+    const auto low = static_cast<std::uint64_t>(difference) | 1;
+    const int same = high != 0 ? std::countl_zero(high) : 64 + std::countl_zero(low);
+    return static_cast<std::size_t>(same) / 8;
 }
 
 }  // namespace

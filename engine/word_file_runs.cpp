@@ -40,8 +40,8 @@ bool RunMerger::next(PackedWord& word) {
 void WordRuns::finish() {
     if (chunk_.empty()) return;
     if (!ascending_) {
-        std::ranges::sort(chunk_);
-        chunk_.erase(std::ranges::unique(chunk_).begin(), chunk_.end());
+        std::sort(chunk_.begin(), chunk_.end());
+        chunk_.erase(std::unique(chunk_.begin(), chunk_.end()), chunk_.end());
     }
     if (runs_.empty() || runs_.back().last() >= chunk_.front()) runs_.emplace_back();
     for (const PackedWord word : chunk_) runs_.back().append(word);
@@ -51,11 +51,12 @@ void WordRuns::finish() {
 }
 
 bool WordRuns::crowded() const {
-    if (merging_) return true;
+    if (merging_ || !spent_.empty()) return true;
     return runs_.size() >= MaxRuns && runs_[runs_.size() - MaxRuns].level == runs_.back().level;
 }
 
 void WordRuns::relieve() {
+    if (!merging_ && !spent_.empty()) return spent_.pop_back();
     if (!merging_) {
         merger_ = RunMerger(std::span(runs_).last(MaxRuns));
         merged_ = {};
@@ -66,13 +67,18 @@ void WordRuns::relieve() {
     for (std::size_t i = 0; i < ChunkSize; ++i) {
         if (merger_.next(word)) {
             merged_.append(word);
-            continue;
+        } else {
+            return replaceMerged();
         }
-        runs_.resize(runs_.size() - MaxRuns);
-        runs_.push_back(std::move(merged_));
-        merging_ = false;
-        return;
     }
+}
+
+void WordRuns::replaceMerged() {
+    const auto first = runs_.end() - MaxRuns;
+    spent_.assign(std::move_iterator(first), std::move_iterator(runs_.end()));
+    runs_.erase(first, runs_.end());
+    runs_.push_back(std::move(merged_));
+    merging_ = false;
 }
 
 std::size_t WordRuns::size() const {

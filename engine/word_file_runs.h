@@ -51,6 +51,8 @@ class WordRuns {
     static constexpr std::size_t ChunkSize = 4096;
     static constexpr std::size_t MaxRuns = 64;  // of one level
 
+    void replaceMerged();
+
     std::vector<WordRun> runs_;  // levels never ascend
     std::vector<PackedWord> chunk_;
     PackedWord last_ = 0;
@@ -59,4 +61,5 @@ class WordRuns {
     bool merging_ = false;
     RunMerger merger_;  // of the last MaxRuns runs, into:
     WordRun merged_;
+    std::vector<WordRun> spent_;  // merged, and given back one by one: that, too, takes its time
 };

@@ -10,7 +10,7 @@ constexpr std::array<unsigned char, 256> MakeCodes(unsigned char separator) {
     for (const unsigned char space : {' ', '\t', '\n', '\v', '\f', '\r'}) codes[space] = separator;
     for (unsigned char letter = 'a'; letter <= 'z'; ++letter) {
         codes[letter] = letter;
-        codes[static_cast<std::size_t>(letter - 'a' + 'A')] = letter;
+        codes[std::size_t{letter} - 'a' + 'A'] = letter;
     }
     return codes;
 }
