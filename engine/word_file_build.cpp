@@ -38,8 +38,8 @@ bool MergedDictionary::isUpToDate() const {
 }
 
 void MergedDictionary::nextHeld() {
-    const std::string_view word = cursor_.next();
-    held_ = word.empty() ? AtEnd : Pack(word);
+    std::string_view word;
+    held_ = cursor_.next(word) ? Pack(word) : AtEnd;
 }
 
 void MergedDictionary::nextFresh() {
