@@ -54,7 +54,7 @@ bool LockFolder(const FileTarget& target) {
         if (errno == EINTR) continue;
         if (errno != EWOULDBLOCK) return KnowsNoLocks(errno);
         if (std::chrono::steady_clock::now() > deadline) return false;
-        const timespec pause{0, 10'000'000};
+        const timespec pause{0, 2'000'000};
         nanosleep(&pause, nullptr);
     }
     return true;

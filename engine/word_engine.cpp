@@ -16,6 +16,7 @@
 #include "settings_file.h"
 #include "word_cursor.h"
 #include "word_file_export.h"
+#include "word_file_merge.h"
 #include "word_reader.h"
 
 // The flat interface: checks what callers pass, and lets no exception out.
@@ -178,6 +179,10 @@ int16_t cDecodeNextWord(char* buffer) {
     return static_cast<int16_t>(word.size());
 }
 
+int32_t cReadTextFile(const char* path) {
+    return Guarded(100, [&] { return MergeStep(path); });
+}
+
 int32_t cWriteTextFile(const char* path) {
     return Guarded(0, [&] { return path != nullptr && ExportWords(path) ? 1 : 0; });
 }
@@ -251,9 +256,4 @@ int32_t cSetRegValue(const char* key, const char* name, const char* text, int32_
         if (key == nullptr || name == nullptr || text == nullptr || length < 0) return 0;
         return SetSetting(key, name, {text, static_cast<std::size_t>(length)}) ? 1 : 0;
     });
-}
-
-// Until the merge of word files is there, nothing steps.
-int32_t cReadTextFile(const char*) {
-    return 100;
 }

@@ -33,6 +33,10 @@ struct Scenario {
     const char* fresh;
 };
 
+void PrintTo(const Scenario& scenario, std::ostream* out) {
+    *out << scenario.name;
+}
+
 bool SaveText(const TempFolder& folder, const char* name) {
     return ReplaceFile((folder / name).c_str(), std::as_bytes(std::span(New, strlen(New))));
 }
