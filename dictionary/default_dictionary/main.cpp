@@ -20,7 +20,9 @@ bool IsWord(const std::string& line) {
 }
 
 // The lists hold some two hundred abbreviations ("blvd", "kg"); having no vowel tells them.
-bool HasVowel(const std::string& word) { return word.find_first_of("aeiouy") != std::string::npos; }
+bool HasVowel(const std::string& word) {
+    return word.find_first_of("aeiouy") != std::string::npos;
+}
 
 bool ReadWords(const char* path, Words& words) {
     std::ifstream file(path);
