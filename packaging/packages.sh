@@ -13,7 +13,7 @@ require_packages() {
     local installed missing=() package
     installed=$(dpkg-query -W -f '${db:Status-Status} ${Package}\n' "$@" 2>/dev/null || true)
     for package in "$@"; do
-        grep -qx "installed $package" <<<"$installed" || missing+=("$package")
+        grep -qxF "installed $package" <<<"$installed" || missing+=("$package")
     done
     [ ${#missing[@]} -gt 0 ] || return 0
 
