@@ -119,6 +119,21 @@ class Program:
                 return letters if all(letters) else None
         return None
 
+    def browse(self, prefix):
+        """Opens the dictionary editor at a two-letter prefix; the words listed there."""
+        self.press("Quorle", "Dictionary editor")
+        editor = self.window("Dictionary Editor")
+        letters = next(node for node in everything_in(editor) if node.getRoleName() == "combo box")
+
+        def chosen():
+            self.click(letters)
+            type_text(prefix)
+            press("Return")
+            time.sleep(0.5)
+            return letters.name.lower() == prefix
+        wait_for(f"prefix {prefix}", chosen)
+        return self.words("Dictionary Editor", "Words")
+
     def leave(self, answer=None):
         """Presses Exit, answers the question, and waits for a clean end without a word said."""
         self.press("Quorle", "Exit game")
