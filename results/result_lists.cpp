@@ -36,8 +36,9 @@ int SelectedIndex(const QListWidget& list) {
 void TakeWord(QListWidget& list, int index) {
     const QSignalBlocker quiet(list.selectionModel());
     const QSignalBlocker quietList(list);
+    const bool wasSelected = list.item(index)->isSelected();
     delete list.takeItem(index);
-    list.clearSelection();
+    if (wasSelected) list.clearSelection();
 }
 
 int IndexOf(const QListWidget& list, const QString& word) {

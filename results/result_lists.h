@@ -14,7 +14,7 @@ void AddWord(QListWidget& list, const QString& word);
 QString SelectedWord(const QListWidget& list);
 int SelectedIndex(const QListWidget& list);
 
-/// Takes the word at `index` out without selecting another.
+/// Takes the word at `index` out; where it was selected, none is afterwards.
 void TakeWord(QListWidget& list, int index);
 
 /// The first index of a word, -1 when it is not listed.

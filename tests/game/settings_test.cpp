@@ -27,12 +27,10 @@ TEST_F(Settings, OutOfRangeOrUnreadableFallBack) {
     };
     for (const Case& stored :
          {Case{"1", 180, 3, True}, Case{"0", 180, 3, False}, Case{"15", 15, 15, False},
-          Case{"300", 300, 3, False}, Case{"45", 180, 3, False},
-          Case{"17", 180, 3, False}, Case{"16", 180, 16, False},
-          Case{"-5", 180, 3, False}, Case{"true", 180, 9, False},
-          Case{"32768", 180, 9, False}, Case{"6 ", 180, 9, False},
-          Case{"10", 180, 10, False}, Case{"0000000000015", 180, 9, True},
-          Case{"", 180, 9, True}}) {
+          Case{"300", 300, 3, False}, Case{"45", 180, 3, False}, Case{"17", 180, 3, False},
+          Case{"16", 180, 16, False}, Case{"-5", 180, 3, False}, Case{"true", 180, 9, False},
+          Case{"32768", 180, 9, False}, Case{"6 ", 180, 9, False}, Case{"10", 180, 10, False},
+          Case{"0000000000015", 180, 9, True}, Case{"", 180, 9, True}}) {
         SCOPED_TRACE(stored.text);
         State.TimeLimit = 180;
         cSetMinWordSize(9);

@@ -47,7 +47,7 @@ void BoxAnswers::expectModal(const std::function<void(QWidget&)>& act) {
 // What a test leaves open would hold it for ever, so it is closed.
 void BoxAnswers::look() {
     QWidget* window = QApplication::activeModalWidget();
-    if (busy_ || window == nullptr || !window->isVisible()) return;
+    if (busy_ || window == nullptr || !window->isActiveWindow()) return;
     busy_ = true;
     if (expected_.empty()) {
         if (!dismissAll_) ADD_FAILURE() << "unexpected: " << TextOf(*window);

@@ -14,12 +14,6 @@ constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
 
 std::function<float()> DesktopRandomness;
 
-void ResetEngine() {
-    cDictionaryClear();
-    cSetMinWordSize(3);
-    cSetMaxWordSize(16);
-}
-
 }  // namespace
 
 void UseHome(const std::string& folder) {
@@ -33,10 +27,16 @@ void UseHome(const std::string& folder) {
 GameFixture::GameFixture() {
     UseHome(folder_.path());
     std::filesystem::create_directory(folder_ / "program");
-    State = GameState();
-    ResetEngine();
+    resetProcess();
     if (!DesktopRandomness) DesktopRandomness = Platform::RandomNumber;
     useTestDesktop();
+}
+
+void GameFixture::resetProcess() {
+    State = GameState();
+    cDictionaryClear();
+    cSetMinWordSize(3);
+    cSetMaxWordSize(16);
 }
 
 void GameFixture::useDesktopRandomness() {
@@ -63,7 +63,7 @@ void GameFixture::makeDictionary(const std::vector<std::string>& words, int maxi
         if (cDictionaryAdd(word.c_str()) != 1) ADD_FAILURE() << "no word: " << word;
     }
     EXPECT_EQ(cWriteBinaryDictionary((folder_ / "program/Dictionary.dat").c_str()), 1);
-    ResetEngine();
+    resetProcess();
 }
 
 void GameFixture::store(const std::string& name, const std::string& text) {

@@ -15,6 +15,9 @@ class GameFixture : public testing::Test {
   protected:
     GameFixture();
 
+    /// State and engine as in a new process.
+    static void resetProcess();
+
     /// Writes the program folder's dictionary, and leaves the engine as at start.
     void makeDictionary(const std::vector<std::string>& words, int maximum = 16);
 

@@ -15,10 +15,30 @@
 #include "game/windows.h"
 #include "platform/platform.h"
 
+namespace {
+
+// A desktop brings a window that is clicked to the front; there is none here.
+void Activate(QWidget& window) {
+    window.activateWindow();
+    if (!QTest::qWaitForWindowActive(&window)) throw std::logic_error("not in front");
+}
+
+}  // namespace
+
 ProgramFixture::~ProgramFixture() {
     boxes_.verify();
+    endProgram();
+}
+
+void ProgramFixture::endProgram() {
     Windows::DestroyAll();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
+
+void ProgramFixture::relaunch() {
+    endProgram();
+    resetProcess();
+    launch();
 }
 
 void ProgramFixture::launch() {
@@ -37,7 +57,8 @@ void ProgramFixture::start(const std::string& board) {
 }
 
 void ProgramFixture::clickOn(const QWidget& widget, const QPoint& place, Qt::MouseButton button) {
-    const QWidget* window = widget.window();
+    QWidget* window = widget.window();
+    if (QApplication::activeModalWidget() == nullptr) Activate(*window);
     QTest::mouseClick(window->windowHandle(), button, {}, widget.mapTo(window, place));
 }
 
@@ -90,8 +111,11 @@ void ProgramFixture::select(const std::string& list, const std::string& word) {
 }
 
 void ProgramFixture::bringToFront(const std::string& window) {
-    control(window)->activateWindow();
-    if (!QTest::qWaitForWindowActive(control(window))) throw std::logic_error("not in front");
+    Activate(*control(window));
+}
+
+bool ProgramFixture::comesToFront(const std::string& window) {
+    return QTest::qWaitForWindowActive(control(window), 2000);
 }
 
 void ProgramFixture::closeByTitleBar(const std::string& window) {

@@ -23,6 +23,9 @@ class ProgramFixture : public GameFixture {
     /// From then on the clock fires only when the test says so.
     void launch();
 
+    /// The program ends, and starts again as a new process would.
+    void relaunch();
+
     // What the player does.
     void start(const std::string& board);   ///< presses Start
     void press(const std::string& button);  ///< by mouse
@@ -38,7 +41,8 @@ class ProgramFixture : public GameFixture {
     void tick(int times = 1);  ///< the clock fires, if it runs
 
     // What the player sees.
-    QWidget* control(const std::string& name);  ///< fails the test when missing
+    QWidget* control(const std::string& name);     ///< fails the test when missing
+    bool comesToFront(const std::string& window);  ///< now or soon
     bool isShown(const std::string& window);
     std::string text(const std::string& control);  ///< of a label, box or button
     std::string typed() { return text("NewWord"); }
@@ -52,6 +56,7 @@ class ProgramFixture : public GameFixture {
     BoxAnswers boxes_;
 
   private:
+    static void endProgram();
     static void clickOn(const QWidget& widget, const QPoint& place, Qt::MouseButton button);
     QWidget* find(const std::string& name);
     QTimer& clock();

@@ -1,0 +1,150 @@
+// One game from Start to its end, and the clock.
+#include <QTest>
+#include <QTimer>
+
+#include "platform/platform.h"
+#include "support/program_fixture.h"
+
+namespace {
+
+class GameFlow : public PlayedBoard {
+  protected:
+    std::string times() { return text("TimeRemLabel") + " " + text("TimeLeft"); }
+};
+
+TEST_F(GameFlow, IsIdleAtFirst) {
+    EXPECT_EQ(letters(), std::string(16, '.'));
+    for (const char* label : {"TimeRemLabel", "TimeLeft", "PlayerWordLabel", "DefinedWordCount"}) {
+        EXPECT_EQ(text(label), "") << label;
+    }
+    EXPECT_FALSE(control("NewWord")->isEnabled());
+    for (const char* button : {"Start", "Pause", "End", "Options", "Dictionary", "Exit"}) {
+        EXPECT_TRUE(control(button)->isEnabled()) << button;
+    }
+    EXPECT_FALSE(isShown("Results"));
+    EXPECT_EQ(control("Main")->size(), QSize(620, 514));
+    tick();
+    EXPECT_EQ(State.TimeRemaining, 0);
+}
+
+TEST_F(GameFlow, AWholeGameRunsOut) {
+    State.TimeLimit = 15;
+    start("CATSBONEWILDHEFY");
+    EXPECT_EQ(letters(), "CATSBONEWILDHEFY");
+    EXPECT_EQ(drawn_, 32);
+    EXPECT_EQ(times(), "Time Remaining 0:15");
+    EXPECT_EQ(text("DefinedWordCount"), "Quorle found 7 words");
+    EXPECT_TRUE(control("NewWord")->hasFocus());
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 0:14");
+    type("cat");
+    key(Qt::Key_Return);
+    type("bo");
+    tick(13);
+    EXPECT_EQ(times(), "Time Remaining 0:01");
+    EXPECT_EQ(typed(), "bo");
+    EXPECT_FALSE(isShown("Results"));
+    tick();
+    EXPECT_EQ(times(), "Game Over ");
+    EXPECT_TRUE(isShown("Results"));
+    EXPECT_EQ(words(), Words{"cat"});
+    EXPECT_EQ(text("PlayerWordLabel"), "1 word entered");
+    EXPECT_EQ(typed(), "");
+    EXPECT_EQ(litTiles(), Tiles{});
+    EXPECT_FALSE(control("NewWord")->isEnabled());
+    tick();
+    EXPECT_EQ(State.TimeRemaining, 0);
+}
+
+TEST_F(GameFlow, StartDropsARunningGame) {
+    start("CATSBONEWILDHEFY");
+    type("cat");
+    key(Qt::Key_Return);
+    clickTiles({4, 5});
+    tick(5);
+    start("QITAKENSHORDGLUB");
+    EXPECT_EQ(words(), Words{});
+    EXPECT_EQ(text("PlayerWordLabel"), "");
+    EXPECT_EQ(times(), "Time Remaining 3:00");
+    EXPECT_EQ(typed(), "");
+    EXPECT_EQ(litTiles(), Tiles{});
+    EXPECT_EQ(State.PickedCount, 0);
+    EXPECT_EQ(State.PickedWord, "");
+    EXPECT_FALSE(isShown("Results"));
+    EXPECT_EQ(text("DefinedWordCount"), "Quorle found 1 words");
+}
+
+TEST_F(GameFlow, APauseHidesTheBoardAndCostsNoTime) {
+    start("CATSBONEWILDHEFY");
+    tick();
+    type("ca");
+    boxes_.expect("Game paused", "Hit OK when ready to resume.", QMessageBox::Ok, QMessageBox::Ok,
+                  [this] {
+                      EXPECT_FALSE(isShown("CubeFrame"));
+                      tick(3);
+                      click(2);  // the box is modal
+                  });
+    press("Pause");
+    EXPECT_TRUE(isShown("CubeFrame"));
+    EXPECT_EQ(typed(), "ca");
+    EXPECT_EQ(times(), "Time Remaining 2:59");
+    EXPECT_TRUE(comesToFront("Main"));
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 2:58");
+    type("t");
+    EXPECT_EQ(litTiles(), (Tiles{0, 1, 2}));
+}
+
+TEST_F(GameFlow, TheClockCountsOnlyWithItsWindowInFront) {
+    start("CATSBONEWILDHEFY");
+    const auto inFront = Platform::WindowInFront;
+    Platform::WindowInFront = [] { return 0; };
+    tick();  // no window of ours: counts, and records none
+    EXPECT_EQ(State.ClockWindow, 0);
+    Platform::WindowInFront = inFront;
+    tick();
+    EXPECT_EQ(State.ClockWindow, 1);
+    EXPECT_EQ(times(), "Time Remaining 2:58");
+    press("End");
+    start("CATSBONEWILDHEFY");
+    bringToFront("Results");
+    tick(3);
+    EXPECT_EQ(times(), "Time Remaining 3:00");
+    seconds_ += 3;
+    press("Results/ResultsOK");
+    EXPECT_FALSE(isShown("Results"));
+    EXPECT_TRUE(comesToFront("Main"));
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 2:59");
+    press("End");
+    start("CATSBONEWILDHEFY");
+    bringToFront("Results");
+    closeByTitleBar("Results");
+    EXPECT_TRUE(comesToFront("Main"));
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 2:59");
+    Platform::WindowInFront = [] { return -1; };  // a box of the main window
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 2:59");
+}
+
+TEST_F(GameFlow, ABoxInFrontAtTheFirstTickStandsForItsWindow) {
+    start("CATSBONEWILDHEFY");
+    boxes_.expect("Quorle", "Wait.", QMessageBox::Ok, QMessageBox::Ok, [this] { tick(2); });
+    Platform::ShowMessage("Wait.", "Quorle");
+    EXPECT_EQ(State.ClockWindow, 1);
+    EXPECT_EQ(times(), "Time Remaining 2:59");
+    EXPECT_TRUE(comesToFront("Main"));
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 2:58");
+}
+
+TEST_F(GameFlow, TheRealClockFires) {
+    auto& timer = *control("Main")->findChild<QTimer*>("GameClock");
+    timer.setInterval(1000);
+    EXPECT_EQ(timer.timerType(), Qt::PreciseTimer);
+    start("CATSBONEWILDHEFY");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return times() == "Time Remaining 2:59"; }, 10000));
+}
+
+}  // namespace

@@ -1,0 +1,65 @@
+// Boxes and file dialogs as the platform layer shows them.
+
+#include <QLineEdit>
+#include <QTest>
+
+#include "platform/platform.h"
+#include "support/program_fixture.h"
+
+namespace {
+
+class Dialogs : public PlayedBoard {
+  protected:
+    void expectNameTyped(const std::string& name) {
+        boxes_.expectModal([=](QWidget& window) {
+            EXPECT_EQ(window.objectName(), "CommonDialog");
+            auto* edit = window.findChild<QLineEdit*>();
+            ASSERT_NE(edit, nullptr);
+            edit->setText(QString::fromStdString(name));
+            QTest::keyClick(edit, Qt::Key_Return);
+        });
+    }
+    void expectReplaceQuestion(const std::string& name, QMessageBox::StandardButton answer) {
+        boxes_.expect("Quorle", name + " already exists. Do you want to replace it?",
+                      QMessageBox::Yes | QMessageBox::No, answer);
+    }
+};
+
+TEST_F(Dialogs, EscapeIsNoAndTheFrontComesBack) {
+    const auto escape = [](QWidget& box) { QTest::keyClick(&box, Qt::Key_Escape); };
+    boxes_.expectModal(escape);
+    EXPECT_FALSE(Platform::AskYesNo("Sure?", "Quorle"));
+    boxes_.expectModal([](QWidget& box) { box.close(); });
+    EXPECT_FALSE(Platform::AskYesNo("Sure?", "Quorle"));
+    boxes_.expectModal([](QWidget& box) {
+        EXPECT_EQ(box.parentWidget()->objectName(), "Main");
+        EXPECT_LT((box.frameGeometry().center() - box.parentWidget()->frameGeometry().center())
+                      .manhattanLength(),
+                  40);
+        QTest::keyClick(&box, Qt::Key_Return);
+    });
+    EXPECT_TRUE(Platform::AskYesNo("Sure?", "Quorle"));
+    EXPECT_TRUE(comesToFront("Main"));
+    EXPECT_EQ(Platform::WindowInFront(), 1);
+}
+
+TEST_F(Dialogs, ASavedFileGetsASuffixAndIsReplacedOnlyWhenAllowed) {
+    const std::string folder = folder_.path();
+    expectNameTyped("words");
+    EXPECT_EQ(Platform::ChooseFileToSave(folder), folder + "/words.txt");
+    folder_.write("words.txt", "cat\n");
+    expectNameTyped("words");
+    expectReplaceQuestion("words.txt", QMessageBox::No);
+    EXPECT_EQ(Platform::ChooseFileToSave(folder), "");
+    expectNameTyped("words");
+    expectReplaceQuestion("words.txt", QMessageBox::Yes);
+    EXPECT_EQ(Platform::ChooseFileToSave(folder), folder + "/words.txt");
+    expectNameTyped("words.list");
+    EXPECT_EQ(Platform::ChooseFileToSave(folder), folder + "/words.list");
+    boxes_.expectModal([](QWidget& dialog) { QTest::keyClick(&dialog, Qt::Key_Escape); });
+    EXPECT_EQ(Platform::ChooseFileToOpen(folder), "");
+    expectNameTyped("words.txt");
+    EXPECT_EQ(Platform::ChooseFileToOpen(folder), folder + "/words.txt");
+}
+
+}  // namespace
