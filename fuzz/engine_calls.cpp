@@ -61,8 +61,8 @@ void Calls::edit(bool add) {
     const std::string text = word();
     if (add) {
         const bool taken = IsWord(text) && static_cast<int>(text.size()) <= max_;
-        REQUIRE(cDictionaryAdd(text.c_str()) == (taken || words_.count(text) == 1 ? 1 : 0) ||
-                words_.count(text) == 1);
+        const int added = cDictionaryAdd(text.c_str());
+        REQUIRE(words_.count(text) == 1 || added == (taken ? 1 : 0));
         if (taken) words_.insert(text);
     } else {
         REQUIRE(cDictionaryRemove(text.c_str()) == static_cast<int>(words_.erase(text)));
