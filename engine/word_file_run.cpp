@@ -6,9 +6,9 @@ namespace {
 std::size_t SharedLetters(PackedWord a, PackedWord b) {
     const PackedWord difference = a ^ b;
     const auto high = static_cast<std::uint64_t>(difference >> 64);
-    const auto low = static_cast<std::uint64_t>(difference) | 1;
+    const auto low = static_cast<std::uint64_t>(difference);
     const int same = high != 0 ? std::countl_zero(high) : 64 + std::countl_zero(low);
-    return static_cast<std::size_t>(same) / 8;
+    return static_cast<std::size_t>(same) / 8 % MaxPackedLetters;
 }
 
 }  // namespace
