@@ -121,6 +121,23 @@ TEST(ReplaceFile, WaitsForAnotherSaverAndGivesUp) {
     EXPECT_EQ(folder.read("file"), "new");
 }
 
+TEST(ReplaceFile, ShowsOneProgramsContentWholeWhenManySave) {
+    const TempFolder folder;
+    for (const char letter : {'a', 'b', 'c'}) {
+        if (fork() != 0) continue;
+        for (int i = 0; i < 20; ++i) Save(folder / "file", std::string(100'000, letter));
+        _exit(Save(folder / "file", std::string(100'000, letter)) ? 0 : 1);
+    }
+    std::set<std::string> seen;
+    for (int status = 0; waitpid(-1, &status, WNOHANG) != -1;) {
+        const std::string content = folder.read("file");
+        if (!content.empty()) seen.insert(content);
+    }
+    for (const auto& content : seen) EXPECT_EQ(content, std::string(100'000, content[0]));
+    EXPECT_GE(seen.size(), 1U);
+    EXPECT_EQ(folder.names(), Names{"file"});
+}
+
 TEST(ReplaceFile, KeepsADamagedFileOnce) {
     const TempFolder folder;
     folder.write("good", "good");

@@ -34,6 +34,14 @@ long Perform(const char* call, long number, Arguments... arguments) {
     return -1;
 }
 
+template <typename Data>
+ssize_t Transfer(const char* call, long number, int file, Data* data, size_t size) {
+    const Fault fault = Next(call);
+    errno = Now.error;
+    if (fault == Fault::Error) return -1;
+    return syscall(number, file, data, fault == Fault::Short ? std::min<size_t>(size, 1) : size);
+}
+
 }  // namespace
 
 void Arm(const Plan& plan) {
@@ -61,16 +69,10 @@ int openat(int folder, const char* path, int flags, ...) {
     return static_cast<int>(Perform("openat", SYS_openat, folder, path, flags, mode));
 }
 ssize_t write(int file, const void* data, size_t size) {
-    const Fault fault = Next("write");
-    errno = Now.error;
-    if (fault == Fault::Error) return -1;
-    return syscall(SYS_write, file, data, fault == Fault::Short ? size / 2 : size);
+    return Transfer("write", SYS_write, file, data, size);
 }
 ssize_t read(int file, void* data, size_t size) {
-    const Fault fault = Next("read");
-    errno = Now.error;
-    if (fault == Fault::Error) return -1;
-    return syscall(SYS_read, file, data, fault == Fault::Short ? std::min<size_t>(size, 1) : size);
+    return Transfer("read", SYS_read, file, data, size);
 }
 int close(int file) {
     return static_cast<int>(Perform("close", SYS_close, file));
