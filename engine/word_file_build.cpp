@@ -9,6 +9,9 @@ namespace {
 constexpr std::size_t WordsAtOnce = 1024;
 constexpr PackedWord AtEnd = ~PackedWord{0};
 
+// Adding a word takes as long as building with so many.
+constexpr std::uint32_t BuiltWhileAdding = 32;
+
 // Someone who changes the dictionary at every step must not keep the merge from ending: the last
 // attempt is made at one go.
 constexpr int MaxAttempts = 8;
@@ -24,7 +27,9 @@ void MergedDictionary::begin() {
     added_ = 0;
     base_ = TheDictionary.words;
     maxWordSize_ = TheDictionary.maxWordSize;
-    builder_ = std::make_unique<GraphBuilder>();
+    const bool few = file_.size() < base_.size() / BuiltWhileAdding;
+    builder_ = few ? nullptr : std::make_unique<GraphBuilder>();
+    copy_ = few ? base_ : WordGraph();
     cursor_ = WordCursor(base_);
     merger_ = RunMerger(file_.runs());
     nextHeld();
@@ -48,8 +53,18 @@ void MergedDictionary::nextFresh() {
     } while (fresh_ != AtEnd && IsLonger(fresh_, static_cast<std::size_t>(maxWordSize_)));
 }
 
+bool MergedDictionary::addToCopy() {
+    for (std::size_t i = 0; i < WordsAtOnce; i += BuiltWhileAdding, ++added_) {
+        if (fresh_ == AtEnd) return false;
+        char letters[MaxPackedLetters];
+        copy_.add({letters, Unpack(fresh_, letters)});
+        nextFresh();
+    }
+    return true;
+}
+
 /// False when all words are in.
-bool MergedDictionary::addWords() {
+bool MergedDictionary::addToBuilder() {
     for (std::size_t i = 0; i < WordsAtOnce; ++i, ++added_) {
         const PackedWord word = std::min(held_, fresh_);
         if (word == AtEnd) return false;
@@ -64,14 +79,14 @@ bool MergedDictionary::addWords() {
 bool MergedDictionary::work() {
     if (!isUpToDate()) begin();
     do {
-        if (addWords()) continue;
-        TheDictionary.words = builder_->finish();
+        if (builder_ ? addToBuilder() : addToCopy()) continue;
+        TheDictionary.words = builder_ ? builder_->finish() : std::move(copy_);
         return true;
     } while (begun_ >= MaxAttempts);
     return false;
 }
 
 double MergedDictionary::fraction() const {
-    const auto words = static_cast<double>(base_.size() + file_.size());
+    const auto words = static_cast<double>(file_.size() + (builder_ ? base_.size() : 0));
     return words == 0 ? 1 : std::min(1.0, static_cast<double>(added_) / words);
 }

@@ -19,7 +19,8 @@ class MergedDictionary {
   private:
     void begin();
     bool isUpToDate() const;
-    bool addWords();
+    bool addToBuilder();
+    bool addToCopy();
     void nextHeld();
     void nextFresh();
 
@@ -28,7 +29,8 @@ class MergedDictionary {
     std::size_t added_ = 0;
     WordGraph base_;
     std::int32_t maxWordSize_ = 0;
-    std::unique_ptr<GraphBuilder> builder_;
+    std::unique_ptr<GraphBuilder> builder_;  // none when the file has only few words:
+    WordGraph copy_;                         // they are added to this one
     WordCursor cursor_;
     RunMerger merger_;
     PackedWord held_ = 0;   // the next word of the dictionary, AtEnd behind the last
