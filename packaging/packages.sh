@@ -4,8 +4,8 @@ PLAY_PACKAGES=(cmake ninja-build g++ pkgconf qt6-base-dev libcanberra-dev libcan
     sound-theme-freedesktop fonts-liberation wamerican-large wbritish-large)
 
 CHECK_PACKAGES=("${PLAY_PACKAGES[@]}" clang-format libgtest-dev libbenchmark-dev libmarisa-dev
-    wamerican-huge wamerican-insane xvfb xauth openbox xdotool dpkg-dev file lintian appstream
-    desktop-file-utils mandoc)
+    dpkg-dev file lintian appstream desktop-file-utils mandoc
+    xvfb xauth openbox xdotool dbus-daemon at-spi2-core python3-pyatspi)
 
 # Installs those of the named packages that are missing, with sudo where that is needed.
 require_packages() {
