@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <bit>
 
+#include "hard_boards.h"
 #include "letter_match.h"
 #include "rank_set.h"
 
@@ -15,9 +16,10 @@
 
 namespace {
 
-constexpr std::size_t Block = 512;       // chains extended together
-constexpr std::size_t MostTouching = 8;  // cubes around a cube
-constexpr std::uint8_t NoCube = Cubes;   // where the empty chain ends; every cube touches it
+constexpr std::size_t Block = 512;        // chains extended together
+constexpr std::size_t HardAfter = 16384;  // chains extended, before they are looked at twice
+constexpr std::size_t MostTouching = 8;   // cubes around a cube
+constexpr std::uint8_t NoCube = Cubes;    // where the empty chain ends; every cube touches it
 constexpr std::uint32_t QBit = 1U << ('q' - 'a');
 constexpr std::uint32_t UBit = 1U << ('u' - 'a');
 
@@ -59,6 +61,7 @@ struct BoardSearch::State {
     std::array<Level, Cubes + 2> levels;
     CubeBits cubes;
     RankSet found;
+    RecentChains recent;  // once a board is hard
     std::vector<std::uint32_t> ranks;
     const std::uint32_t* nodes;
     std::uint32_t minLetters;
@@ -68,6 +71,7 @@ struct BoardSearch::State {
     void extend(const Match& match, const Chain& chain, Level& longer);
     template <class Match>
     void run();
+    void thinOut(Level& level, std::size_t begin, std::size_t& end);
     void mark(std::uint32_t rank, std::uint32_t letters) {
         if (letters >= minLetters && letters <= maxLetters) found.insert(rank);
     }
@@ -102,10 +106,24 @@ inline void BoardSearch::State::extend(const Match& match, const Chain& chain, L
     }
 }
 
+// Drops the chains from `begin` on that need not be extended.
+void BoardSearch::State::thinOut(Level& level, std::size_t begin, std::size_t& end) {
+    Exhaustion exhaustion(nodes, found, minLetters, maxLetters);
+    const auto isIdle = [&](const Chain& chain) {
+        return exhaustion.holds(chain.node, chain.firstWord, chain.letters) ||
+               !recent.add(chain.firstWord, chain.letters, chain.used, chain.cube);
+    };
+    Chain* first = level.chains.data() + begin;
+    Chain* last = level.chains.data() + end;
+    end = begin + static_cast<std::size_t>(std::remove_if(first, last, isIdle) - first);
+}
+
 template <class Match>
 inline void BoardSearch::State::run() {
     const Match match(cubes);
     std::size_t length = 0;
+    std::size_t extended = 0;
+    bool isHard = false;
     while (true) {
         Level& level = levels[length];
         if (level.count == 0) {
@@ -113,8 +131,14 @@ inline void BoardSearch::State::run() {
             --length;
             continue;
         }
-        const std::size_t end = level.count;
+        std::size_t end = level.count;
         level.count -= std::min(end, Block);
+        if (isHard) thinOut(level, level.count, end);
+        extended += end - level.count;
+        if (!isHard && extended >= HardAfter) {
+            isHard = true;
+            recent.clear();
+        }
         for (std::size_t i = level.count; i < end; ++i) {
             extend(match, level.chains[i], levels[length + 1]);
         }

@@ -3,7 +3,7 @@
 #include <string.h>
 
 #include <algorithm>
-#include <optional>
+#include <memory>
 #include <string>
 #include <string_view>
 
@@ -26,7 +26,7 @@ namespace {
 WordCursor Listing;
 
 struct LastSearch {
-    std::optional<BoardSearch> search;  // made by the first search
+    std::unique_ptr<BoardSearch> search;  // made by the first search
     WordReader reader;
     std::vector<std::uint32_t> found;
 };
@@ -97,10 +97,12 @@ void SearchBoard(std::string_view letters) {
     for (std::size_t i = 0; i < board.size(); ++i) {
         board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
     }
-    if (!Found.search) Found.search.emplace();
-    Found.found = Found.search->search(TheDictionary.words, board,
-                                       {TheDictionary.minWordSize, TheDictionary.maxWordSize});
+    // Out of memory, a search is left in its midst, and must not be used again.
+    auto search = Found.search ? std::move(Found.search) : std::make_unique<BoardSearch>();
+    Found.found = search->search(TheDictionary.words, board,
+                                 {TheDictionary.minWordSize, TheDictionary.maxWordSize});
     Found.reader = WordReader(TheDictionary.words);
+    Found.search = std::move(search);
 }
 
 }  // namespace
