@@ -134,9 +134,12 @@ std::map<std::string, int> Saving::saveWith(const Plan& plan) const {
     // When the folder's sync has failed only whether the new content is on the disk is not known.
     const bool folderSync = plan.call == "fsync" && calls.count("renameat") == 1;
     EXPECT_EQ(done || folderSync, saved);
+    const Names fatal{"write", "fsync", "renameat", "fchmod"};
     const Names repeated{"openat", "read", "write", "fsync", "flock", "close"};
     if (plan.fault != Fault::Error || (plan.error == EINTR && repeated.count(plan.call) == 1)) {
         EXPECT_TRUE(done);
+    } else if (fatal.count(plan.call) == 1) {
+        EXPECT_FALSE(done);
     }
     return calls;
 }
