@@ -96,8 +96,9 @@ void Calls::merge() {
     std::string text;
     for (int i = number() % 40; i > 0; --i) {
         const std::string token = word();
+        if (!IsWord(token)) continue;  // what else a file may hold has a target of its own
         text += token + "\n";
-        if (IsWord(token) && static_cast<int>(token.size()) <= max_) words_.insert(token);
+        if (static_cast<int>(token.size()) <= max_) words_.insert(token);
     }
     Fuzz::Merge(Fuzz::Write("words.txt", text));
 }
