@@ -94,7 +94,7 @@ void SaveAsText() {
 void LeaveEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     editor.Words->setStringList({});
-    editor.hide();
+    WindowFront::Hide(editor);
     WindowFront::Bring(Windows::Shared<Main>());
 }
 

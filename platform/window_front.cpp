@@ -4,6 +4,7 @@
 #include <QEvent>
 #include <QList>
 #include <QPointer>
+#include <QWindow>
 #include <algorithm>
 #include <array>
 
@@ -60,6 +61,8 @@ void Bring(QWidget& window) {
 void Hide(QWidget& window) {
     const bool wasInFront = window.isActiveWindow();
     window.hide();
+    // Without a place of its own the window manager would choose another next time.
+    if (QWindow* handle = window.windowHandle()) handle->setFramePosition(window.pos());
     if (wasInFront) GiveBack();
 }
 

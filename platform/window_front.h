@@ -13,7 +13,7 @@ void Follow(QWidget* window);
 /// Shows a window, or brings it back: restored, raised and activated.
 void Bring(QWidget& window);
 
-/// Hides a window; when it was in front, gives the front back.
+/// Hides a window, which keeps its place; when it was in front, gives the front back.
 void Hide(QWidget& window);
 
 /// Activates the window that was in front last and is still shown, else the
