@@ -1,6 +1,7 @@
 #pragma once
 // Building the minimal graph of sorted words in one pass.
 #include <array>
+#include <cstdlib>
 #include <memory>
 #include <string_view>
 #include <vector>
@@ -10,7 +11,8 @@
 /// Takes words in strictly ascending order, one by one, each in bounded time; so is finishing.
 class GraphBuilder {
   public:
-    GraphBuilder();
+    /// Makes room ahead for about so many words, which saves moving what is built as it grows.
+    explicit GraphBuilder(std::size_t expectedWords = 0);
 
     /// `word`: 1 to 16 letters, after every word before it. Throws std::bad_alloc; then the
     /// builder is of no more use.
@@ -27,8 +29,24 @@ class GraphBuilder {
         std::array<std::uint32_t, 2 * Letters> content{};  // link, skip, link, skip, ...
     };
 
+    // The stored nodes by their content: a hash table with open addressing.
+    struct Slot {
+        NodeIndex node;  // NoNode: free
+        std::uint32_t hash;
+    };
+    struct Free {
+        void operator()(Slot* slots) const { std::free(slots); }
+    };
+    struct Register {
+        explicit Register(std::size_t slotCount);
+        std::unique_ptr<Slot[], Free> slots;
+        std::size_t size;
+    };
+
     void closeNodes(std::size_t depth);
     NodeIndex store(const OpenNode& open);
+    NodeIndex append(const OpenNode& open);
+    Slot& find(const Register& table, const OpenNode& open, std::uint32_t hash) const;
     void growRegister();
 
     std::shared_ptr<NodeStore> nodes_;
@@ -36,6 +54,11 @@ class GraphBuilder {
     std::array<char, LongestWord> last_{};
     std::size_t lastSize_ = 0;
     std::uint32_t size_ = 0;
-    std::vector<NodeIndex> register_;  // a hash table of the stored nodes; NoNode: free
+    // A full table is moved into one of twice the size a few slots with each new node, so that no
+    // word takes long; until that is done both are looked at.
+    Register register_;
+    Register moving_{0};
+    std::size_t moved_ = 0;
     std::size_t stored_ = 0;
+    std::size_t room_ = 0;  // words of the store reserved and not used
 };

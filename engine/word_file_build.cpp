@@ -28,7 +28,8 @@ void MergedDictionary::begin() {
     base_ = TheDictionary.words;
     maxWordSize_ = TheDictionary.maxWordSize;
     const bool few = file_.size() < base_.size() / BuiltWhileAdding;
-    builder_ = few ? nullptr : std::make_unique<GraphBuilder>();
+    const std::size_t expected = base_.size() + file_.size();
+    builder_ = few ? nullptr : std::make_unique<GraphBuilder>(expected);
     copy_ = few ? base_ : WordGraph();
     cursor_ = WordCursor(base_);
     merger_ = RunMerger(file_.runs());

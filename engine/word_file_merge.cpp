@@ -15,7 +15,7 @@ namespace {
 using Clock = std::chrono::steady_clock;
 
 // A piece of work more may follow when the time is up.
-constexpr std::chrono::microseconds StepTime{4500};
+constexpr std::chrono::microseconds StepTime{4000};
 constexpr double ReadingShare = 0.5;  // of a file's time; the rest is building
 
 /// A file on its way into the dictionary.

@@ -9,7 +9,7 @@
 
 namespace {
 
-constexpr std::size_t BlockSize = std::size_t{64} << 10;
+constexpr std::size_t BlockSize = std::size_t{16} << 10;
 
 /// Fills `block` as far as the file goes; false when it cannot be read.
 bool ReadBlock(int file, std::span<std::byte> block, std::size_t& used) {
