@@ -18,8 +18,8 @@ constexpr int BandHeight = 16;  // device pixels
 constexpr qreal Margin = 1;
 constexpr qreal CornerRadius = 17;
 constexpr qreal OutlineWidth = 3;
-constexpr qreal RingInset = 9;
-constexpr qreal RingWidth = 2.5;
+constexpr qreal RingInset = 5.5;
+constexpr qreal RingWidth = 2;
 constexpr double LetterPoints = 48;
 
 const QColor OutlineColour(128, 128, 128);

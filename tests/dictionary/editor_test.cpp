@@ -49,13 +49,6 @@ TEST_F(Editor, RefusesWhatIsNoWordOfThreeToSixteenLetters) {
     EXPECT_FALSE(State.DictionaryChanged);
 }
 
-TEST_F(Editor, DoesNothingWithAnEmptyBox) {
-    cDictionaryAdd("elsewhere");
-    key(Qt::Key_Return);
-    EXPECT_EQ(text("WordCount"), "4 words");
-    EXPECT_FALSE(State.DictionaryChanged);
-}
-
 TEST_F(Editor, RemovesTheSelectedWordAndKeepsThePrefixWhileItLasts) {
     QWidget* list = control("DictionaryEditor/WordList");
     prefixes().setCurrentText("CA");

@@ -116,15 +116,6 @@ TEST_F(Merging, ASecondFileWaitsInLine) {
     EXPECT_EQ(text("WordCount"), std::to_string(2 * ManyWords + 4) + " words");
 }
 
-TEST_F(Merging, LeavingEndsItUnfinished) {
-    merge(manyWords('a'));
-    press("Main/Exit");
-    EXPECT_FALSE(stepping());
-    EXPECT_FALSE(isShown("Progress"));
-    EXPECT_FALSE(isShown("Main"));
-    EXPECT_EQ(wordsOnDisk(), 4);
-}
-
 TEST_F(Merging, LeavingOffersWhatElseChanged) {
     enter("apt");
     merge(manyWords('a'));
