@@ -37,24 +37,4 @@ TEST_F(ShakenCubes, ComeFromSixteenCubesInEveryOrder) {
     EXPECT_EQ(corner.size(), 26U);  // every letter of the cubes comes to the last place
 }
 
-TEST_F(ShakenCubes, DrawsStayBelowTheirBound) {
-    for (std::int16_t n = 1; n <= 16; ++n) {
-        draws_ = {0x1.fffffep-1F, 0.0F};
-        EXPECT_EQ(Dice::RandomBelow(n), n - 1);
-        EXPECT_EQ(Dice::RandomBelow(n), 0);
-    }
-    std::array<int, 16> seen{};
-    useDesktopRandomness();
-    for (int i = 0; i < 16000; ++i) ++seen.at(static_cast<std::size_t>(Dice::RandomBelow(16)));
-    for (const int count : seen) EXPECT_NEAR(count, 1000, 200);
-}
-
-TEST_F(ShakenCubes, ShowQuForQ) {
-    putOnBoard("QABCDEFGHIJKLMNO");
-    EXPECT_EQ(State.CubeLetters[0], "Qu");
-    EXPECT_EQ(State.BoardGrid[0][0], "qu");
-    EXPECT_EQ(State.CubeLetters[6], "F");
-    EXPECT_EQ(State.BoardGrid[1][2], "f");
-}
-
 }  // namespace

@@ -5,17 +5,6 @@ namespace {
 
 using Editor = OpenEditor;
 
-TEST_F(Editor, OpensAtTheFirstPrefixReadyForAWord) {
-    EXPECT_EQ(offered(), "BO CA ZO");
-    EXPECT_EQ(listed(), Words{"bone"});
-    EXPECT_EQ(text("WordCount"), "4 words");
-    EXPECT_EQ(control("DictionaryEditor")->focusWidget(), control("DictionaryEditor/NewWord"));
-    prefixes().setCurrentText("CA");
-    EXPECT_EQ(listed(), (Words{"cab", "cat"}));
-    press("Dictionary");
-    EXPECT_EQ(selectedPrefix(), "BO");
-}
-
 TEST_F(Editor, AddsTypedWordsOneAfterAnother) {
     prefixes().setCurrentText("CA");
     for (const char* word : {"Apt", "CAPE", "sixteenlettersab"}) {

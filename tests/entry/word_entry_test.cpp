@@ -46,24 +46,6 @@ TEST_F(WordEntry, TypingLightsTheChainAndTakesTheRestOff) {
     EXPECT_EQ(warnings(), 10);
 }
 
-TEST_F(WordEntry, PasteKeepsItsLongestTraceableBeginning) {
-    start("CATSBONEWILDHEFY");
-    paste("catsXYZ");
-    EXPECT_EQ(typed(), "cats");
-    EXPECT_EQ(litTiles(), (Tiles{0, 1, 2, 3}));
-    EXPECT_EQ(warnings(), 3);
-    replaceAll("bone" + std::string(30000, 'e'));
-    EXPECT_EQ(typed(), "bone");
-    EXPECT_EQ(litTiles(), (Tiles{4, 5, 6, 7}));
-    EXPECT_EQ(warnings(), 3 + 30000);
-    replaceAll(std::string(1000, '\x01') + "cat\n\xE2\x80\xAE");
-    EXPECT_EQ(typed(), "");
-    EXPECT_EQ(litTiles(), Tiles{});
-    replaceAll("ca\xC3\xA9\xF0\x9F\x98\x80");
-    EXPECT_EQ(typed(), "ca");
-    EXPECT_EQ(warnings(), 3 + 30000 + 1005 + 2);
-}
-
 TEST_F(WordEntry, QuIsOneCube) {
     start("QITAKENSHORDGLUB");
     EXPECT_EQ(letters(), "QuITAKENSHORDGLUB");
@@ -210,22 +192,6 @@ TEST_F(WordEntry, TextThatEqualsTheClicksStaysUntilSubmission) {
     EXPECT_EQ(typed(), "");
     EXPECT_EQ(words(), Words{});
     EXPECT_EQ(State.PickedCount, 0);
-}
-
-TEST_F(WordEntry, IsClosedBetweenGames) {
-    start("CATSBONEWILDHEFY");
-    clickTiles({0, 1, 2});
-    press("End");
-    bringToFront("Main");
-    click(2);
-    doubleClick(5);
-    press("Enter");
-    press("Clear");
-    EXPECT_EQ(words(), Words{});
-    EXPECT_EQ(typed(), "");
-    EXPECT_EQ(litTiles(), Tiles{});
-    EXPECT_EQ(warnings(), 0);
-    EXPECT_FALSE(control("NewWord")->isEnabled());
 }
 
 // The typing rule as it stands: the text is cut by one letter, and the rule runs

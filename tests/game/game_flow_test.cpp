@@ -12,21 +12,6 @@ class GameFlow : public PlayedBoard {
     std::string times() { return text("TimeRemLabel") + " " + text("TimeLeft"); }
 };
 
-TEST_F(GameFlow, IsIdleAtFirst) {
-    EXPECT_EQ(letters(), std::string(16, '.'));
-    for (const char* label : {"TimeRemLabel", "TimeLeft", "PlayerWordLabel", "DefinedWordCount"}) {
-        EXPECT_EQ(text(label), "") << label;
-    }
-    EXPECT_FALSE(control("NewWord")->isEnabled());
-    for (const char* button : {"Start", "Pause", "End", "Options", "Dictionary", "Exit"}) {
-        EXPECT_TRUE(control(button)->isEnabled()) << button;
-    }
-    EXPECT_FALSE(isShown("Results"));
-    EXPECT_EQ(control("Main")->size(), QSize(620, 514));
-    tick();
-    EXPECT_EQ(State.TimeRemaining, 0);
-}
-
 TEST_F(GameFlow, AWholeGameRunsOut) {
     State.TimeLimit = 15;
     start("CATSBONEWILDHEFY");

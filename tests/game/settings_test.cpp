@@ -1,23 +1,13 @@
-// The four settings, and times as text.
+// The four settings.
 #include "game/settings.h"
 
 #include <quorle/word_engine.h>
 
-#include "game/format_time.h"
 #include "support/game_fixture.h"
 
 namespace {
 
 class Settings : public GameFixture {};
-
-TEST_F(Settings, AbsentLeaveEverythingAsItIs) {
-    cSetMinWordSize(5);
-    Common::LoadSettings();
-    EXPECT_EQ(State.TimeLimit, 180);
-    EXPECT_EQ(State.Sounds, True);
-    EXPECT_EQ(cMinWordSize(), 5);
-    EXPECT_EQ(cMaxWordSize(), 16);
-}
 
 TEST_F(Settings, OutOfRangeOrUnreadableFallBack) {
     struct Case {
@@ -59,15 +49,6 @@ TEST_F(Settings, AreAllSavedAndReadAgain) {
     EXPECT_EQ(State.TimeLimit, 15);
     EXPECT_EQ(State.Sounds, False);
     EXPECT_EQ(cMinWordSize(), 2);
-}
-
-TEST_F(Settings, TimesHaveTwoDigitsOfSeconds) {
-    EXPECT_EQ(FormatTime(0), "0:00");
-    EXPECT_EQ(FormatTime(9), "0:09");
-    EXPECT_EQ(FormatTime(59), "0:59");
-    EXPECT_EQ(FormatTime(60), "1:00");
-    EXPECT_EQ(FormatTime(75), "1:15");
-    EXPECT_EQ(FormatTime(300), "5:00");
 }
 
 }  // namespace
