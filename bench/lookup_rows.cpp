@@ -1,0 +1,65 @@
+#include <marisa.h>
+
+#include <algorithm>
+#include <memory>
+#include <random>
+#include <unordered_set>
+
+#include "quorle/word_engine.h"
+#include "rows.h"
+#include "table.h"
+
+namespace {
+
+/// Words held, and as many with a letter changed, mixed.
+std::vector<std::string> Questions(const WordList& words) {
+    std::mt19937 random(3);
+    std::vector<std::string> questions;
+    for (int i = 0; i < 50000; ++i) {
+        questions.push_back(words[random() % words.size()]);
+        std::string other = words[random() % words.size()];
+        other[random() % other.size()] = static_cast<char>('a' + random() % 26);
+        questions.push_back(other);
+    }
+    std::shuffle(questions.begin(), questions.end(), random);
+    return questions;
+}
+
+bool Held(std::string& word) {
+    std::int32_t found = 0;
+    std::int32_t other = 0;
+    return cDictionaryCheck(word.data(), &found, &other) != 0;
+}
+
+}  // namespace
+
+void AddLookupRows(const WordList& words) {
+    const std::string dictionary = DictionaryOf("huge", words);
+    const auto prepare = [dictionary] { cReadBinaryDictionary(dictionary.c_str()); };
+    auto set = std::make_shared<std::unordered_set<std::string>>(words.begin(), words.end());
+    auto trie = std::make_shared<marisa::Trie>();
+    marisa::Keyset keys;
+    for (const std::string& word : words) keys.push_back(word.c_str(), word.size());
+    trie->build(keys);
+    auto agent = std::make_shared<marisa::Agent>();
+    auto questions = std::make_shared<std::vector<std::string>>(Questions(words));
+    prepare();
+    for (std::string& word : *questions) {
+        agent->set_query(word.c_str(), word.size());
+        const bool held = set->contains(word);
+        Require(Held(word) == held && trie->lookup(*agent) == held, word.c_str());
+    }
+    auto at = std::make_shared<std::size_t>(0);
+    const auto next = [questions, at]() -> std::string& {
+        return (*questions)[(*at)++ % questions->size()];
+    };
+    const auto ours = [next] { Held(next()); };
+    AddRatio({"lookup, hits and misses", "unordered_set", "2 ×", "3 ×"}, prepare, ours,
+             [next, set] { return set->contains(next()); });
+    AddRatio({"lookup, hits and misses", "marisa-trie", "6 ×", "10 ×"}, prepare, ours,
+             [next, trie, agent] {
+                 const std::string& word = next();
+                 agent->set_query(word.c_str(), word.size());
+                 return trie->lookup(*agent);
+             });
+}
