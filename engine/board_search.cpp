@@ -49,8 +49,27 @@ constexpr std::array<std::uint16_t, Cubes + 1> MakeTouching() {
 
 constexpr auto Touching = MakeTouching();
 
+/// On the way along a cube's letters.
+struct Step {
+    NodeIndex node;
+    std::uint32_t firstWord;
+    std::uint32_t letters;
+};
+
+/// Where the next chain and the next word found go.
+struct Output {
+    Chain* chains;
+    std::uint32_t* words;
+};
+
+/// A chain and the cubes that it can still go on with.
+struct Growing {
+    const Chain* chain;
+    std::uint32_t cubesLeft;
+};
+
 struct Level {
-    std::array<Chain, Block * MostTouching> chains;
+    std::array<Chain, Block * MostTouching + 1> chains;
     std::size_t count;
 };
 
@@ -67,43 +86,79 @@ struct BoardSearch::State {
     std::uint32_t minLetters;
     std::uint32_t maxLetters;
 
+    // Words found by the block being extended.
+    std::array<std::uint32_t, 2 * Block * MostTouching + 1> words;
+
+    std::array<Growing, Block + 1> growing;
+
     template <class Match>
-    void extend(const Match& match, const Chain& chain, Level& longer);
+    std::size_t matchBlock(const Match& match, const Chain* chain, const Chain* end);
+    void growBlock(std::size_t count, Output& out);
+    void grow(const Chain& chain, std::uint32_t cube, Output& out) const;
+    void take(Step& step, std::uint32_t bit, Output& out) const;
+    template <class Match>
+    void extendBlock(const Match& match, const Chain* chain, const Chain* end, Level& longer);
     template <class Match>
     void run();
     void thinOut(Level& level, std::size_t begin, std::size_t& end);
-    void mark(std::uint32_t rank, std::uint32_t letters) {
-        if (letters >= minLetters && letters <= maxLetters) found.insert(rank);
-    }
 };
 
+// Finds the cubes that each chain of the block can go on with, and gathers the chains that have
+// any. Returns the number of such cubes, all chains together.
 template <class Match>
-inline void BoardSearch::State::extend(const Match& match, const Chain& chain, Level& longer) {
-    const std::uint32_t* node = nodes + chain.node;
-    std::uint32_t next = match(node[0]) & Touching[chain.cube] & ~std::uint32_t{chain.used};
-    for (; next != 0; next &= next - 1) {
-        const auto cube = static_cast<std::uint32_t>(std::countr_zero(next));
-        const std::uint32_t bit = cubes[cube];
-        const std::uint32_t* edge = node + LinkOffset(node[0], bit);
-        std::uint32_t letters = chain.letters + 1U;
-        std::uint32_t firstWord = chain.firstWord + edge[1];
-        if ((edge[0] & WordEnds) != 0) mark(firstWord++, letters);
-        NodeIndex child = ChildOf(edge[0]);
-        if (bit == QBit) {
-            // Past a Qu cube a word goes on with its "u" or not at all.
-            const std::uint32_t* afterQ = nodes + child;
-            if ((afterQ[0] & UBit) == 0) continue;
-            edge = afterQ + LinkOffset(afterQ[0], UBit);
-            ++letters;
-            firstWord += edge[1];
-            if ((edge[0] & WordEnds) != 0) mark(firstWord++, letters);
-            child = ChildOf(edge[0]);
-        }
-        if (child == NoNode || letters >= maxLetters) continue;
-        longer.chains[longer.count++] = {
-            child, firstWord, static_cast<std::uint16_t>(chain.used | (1U << cube)),
-            static_cast<std::uint8_t>(cube), static_cast<std::uint8_t>(letters)};
+inline std::size_t BoardSearch::State::matchBlock(const Match& match, const Chain* chain,
+                                                  const Chain* end) {
+    std::size_t count = 0;
+    Growing* last = growing.data();
+    for (; chain != end; ++chain) {
+        const std::uint32_t cubesLeft =
+            match(nodes[chain->node]) & Touching[chain->cube] & ~std::uint32_t{chain->used};
+        *last = {chain, cubesLeft};
+        last += cubesLeft != 0 ? 1 : 0;
+        count += static_cast<std::size_t>(std::popcount(cubesLeft));
     }
+    return count;
+}
+
+// Makes the longer chains of those gathered. No branch depends on what the board shows: chains and
+// words are written first and counted after, and going on to the next chain is a choice of values.
+inline void BoardSearch::State::growBlock(std::size_t count, Output& out) {
+    const Growing* from = growing.data();
+    std::uint32_t cubesLeft = from->cubesLeft;
+    for (; count > 0; --count) {
+        grow(*from->chain, static_cast<std::uint32_t>(std::countr_zero(cubesLeft)), out);
+        cubesLeft &= cubesLeft - 1;
+        from += cubesLeft == 0 ? 1 : 0;
+        cubesLeft = cubesLeft == 0 ? from->cubesLeft : cubesLeft;
+    }
+}
+
+inline void BoardSearch::State::grow(const Chain& chain, std::uint32_t cube, Output& out) const {
+    const std::uint32_t bit = cubes[cube];
+    Step step{chain.node, chain.firstWord, chain.letters};
+    take(step, bit, out);
+    if (bit == QBit) {
+        // Past a Qu cube a word goes on with its "u" or not at all.
+        if ((nodes[step.node] & UBit) == 0) return;
+        take(step, UBit, out);
+    }
+    __builtin_prefetch(nodes + step.node);
+    *out.chains = {step.node, step.firstWord, static_cast<std::uint16_t>(chain.used | (1U << cube)),
+                   static_cast<std::uint8_t>(cube), static_cast<std::uint8_t>(step.letters)};
+    out.chains += step.node != NoNode && step.letters < maxLetters ? 1 : 0;
+}
+
+// Goes along the letter, which the node has.
+inline void BoardSearch::State::take(Step& step, std::uint32_t bit, Output& out) const {
+    const std::uint32_t* node = nodes + step.node;
+    const std::uint32_t* link = node + LinkOffset(node[0], bit);
+    const std::uint32_t isWord = link[0] >> 31;
+    ++step.letters;
+    step.firstWord += link[1];
+    *out.words = step.firstWord;
+    out.words += isWord != 0 && step.letters >= minLetters && step.letters <= maxLetters ? 1 : 0;
+    step.firstWord += isWord;
+    step.node = ChildOf(link[0]);
 }
 
 // Drops the chains from `begin` on that need not be extended.
@@ -116,6 +171,15 @@ void BoardSearch::State::thinOut(Level& level, std::size_t begin, std::size_t& e
     Chain* first = level.chains.data() + begin;
     Chain* last = level.chains.data() + end;
     end = begin + static_cast<std::size_t>(std::remove_if(first, last, isIdle) - first);
+}
+
+template <class Match>
+inline void BoardSearch::State::extendBlock(const Match& match, const Chain* chain,
+                                            const Chain* end, Level& longer) {
+    Output out{longer.chains.data(), words.data()};
+    growBlock(matchBlock(match, chain, end), out);
+    longer.count = static_cast<std::size_t>(out.chains - longer.chains.data());
+    for (const std::uint32_t* word = words.data(); word != out.words; ++word) found.insert(*word);
 }
 
 template <class Match>
@@ -139,9 +203,8 @@ inline void BoardSearch::State::run() {
             isHard = true;
             recent.clear();
         }
-        for (std::size_t i = level.count; i < end; ++i) {
-            extend(match, level.chains[i], levels[length + 1]);
-        }
+        extendBlock(match, level.chains.data() + level.count, level.chains.data() + end,
+                    levels[length + 1]);
         ++length;
     }
 }

@@ -1,7 +1,5 @@
 #include "quorle/word_engine.h"
 
-#include <string.h>
-
 #include <algorithm>
 #include <memory>
 #include <string>
@@ -49,7 +47,9 @@ bool IsLetters(std::string_view text) {
 
 /// At most 17 characters, so that a text without end is not read.
 std::string_view Beginning(const char* text) {
-    return {text, ::strnlen(text, LongestWord + 1)};
+    std::size_t size = 0;
+    while (size <= LongestWord && text[size] != 0) ++size;
+    return {text, size};
 }
 
 bool IsWord(std::string_view text) {

@@ -85,6 +85,25 @@ TEST_P(BoardSearchTest, FindsWhatTryingEveryWordFinds) {
     }
 }
 
+// Boards of few letters and words that are everywhere on them: more chains than are ever followed
+// twice. The limits leave words that are never found, the dead end is a word that does not fit.
+TEST_P(BoardSearchTest, HardBoards) {
+    Words words;
+    for (std::size_t size = 2; size <= 16; ++size) words.insert(std::string(size, 'a'));
+    words.insert({"aaaaaaaaaaaaab", "aaaaaaaaaaaaaaab"});
+    for (int i = 0; i < 512; ++i) {
+        std::string word;
+        for (int bit = 0; bit < 9; ++bit) word += "ab"[i >> bit & 1];
+        words.insert(word);
+    }
+    const WordGraph graph = Built(words);
+    for (const std::string board : {"aaaaaaaaaaaaaaaa", "aaaaaaaaaaaaaaab", "abababbaababbaab"}) {
+        for (const SearchLimits limits : {SearchLimits{3, 16}, {2, 9}}) {
+            EXPECT_EQ(found(graph, board, limits), OnBoard(words, board, limits)) << board;
+        }
+    }
+}
+
 INSTANTIATE_TEST_SUITE_P(All, BoardSearchTest,
                          testing::Values(Matching::Plain, Matching::Avx2, Matching::Avx512));
 
