@@ -54,8 +54,8 @@ void AddSearches(const Row& row, const std::vector<std::string>& boards,
     }
     auto ours = std::make_shared<Boards>(boards);
     auto theirs = std::make_shared<Boards>(boards);
-    AddRatio(
-        row, [dictionary] { cReadBinaryDictionary(dictionary.c_str()); },
+    AddTimings(
+        row, Compared::Ratio, [dictionary] { cReadBinaryDictionary(dictionary.c_str()); },
         [ours, fetch] {
             if (fetch) {
                 FetchAll(ours->next());

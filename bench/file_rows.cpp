@@ -27,20 +27,20 @@ void LoadSet(const std::string& text) {
 
 void AddLoads(const std::string& dictionary, const std::string& text, const std::string& marisa) {
     const auto load = [dictionary] { cReadBinaryDictionary(dictionary.c_str()); };
-    AddRatio({"load with all checks, again", "text into unordered_set", "30 ×", "80 ×"}, load, load,
-             [text] { LoadSet(text); });
-    AddShare({"load with all checks, again", "marisa-trie's load", "15", "4"}, load, load,
-             [marisa] {
-                 marisa::Trie trie;
-                 trie.load(marisa.c_str());
-             });
+    AddTimings({"load with all checks, again", "text into unordered_set", "30 ×", "80 ×"},
+               Compared::Ratio, load, load, [text] { LoadSet(text); });
+    AddTimings({"load with all checks, again", "marisa-trie's load", "15", "4"}, Compared::Share,
+               load, load, [marisa] {
+                   marisa::Trie trie;
+                   trie.load(marisa.c_str());
+               });
 }
 
 void AddMerges(const std::string& text) {
     const auto nothing = [] {};
-    AddRatio(
+    AddTimings(
         {"merge of a whole list into an empty dictionary", "marisa-trie's build", "2 ×", "6 ×"},
-        nothing,
+        Compared::Ratio, nothing,
         [text] {
             cDictionaryClear();
             Merge(text);
@@ -68,11 +68,12 @@ void AddMerges(const std::string& text) {
     Require(std::system(("cmp -s " + merged + " " + sorted).c_str()) == 0, "merge");
     AddFigure({"longest merge step", "a frame of 16 ms", "under 16 ms", "under 6 ms"},
               Rounded(longest, " ms"));
-    AddShare(
+    AddTimings(
         {"merge of american-english-insane into american-english-large", "sort -u of both", "1",
          "0.25"},
-        [dictionary] { cReadBinaryDictionary(dictionary.c_str()); }, [insane] { Merge(insane); },
-        [sort] { Require(std::system(sort.c_str()) == 0, "sort"); }, 1);
+        Compared::ShareByClock, [dictionary] { cReadBinaryDictionary(dictionary.c_str()); },
+        [insane] { Merge(insane); }, [sort] { Require(std::system(sort.c_str()) == 0, "sort"); },
+        1);
 }
 
 }  // namespace

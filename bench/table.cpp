@@ -11,7 +11,7 @@ namespace {
 struct TableRow {
     Row row;
     std::string figure;  // empty: from the timings
-    bool isShare = false;
+    Compared compared = Compared::Ratio;
 };
 
 std::vector<TableRow> Rows;
@@ -23,7 +23,8 @@ class Shortest : public benchmark::BenchmarkReporter {
     void ReportRuns(const std::vector<Run>& runs) override {
         for (const Run& run : runs) {
             if (run.run_type != Run::RT_Iteration || run.error_occurred) continue;
-            const double time = run.GetAdjustedCPUTime();
+            const bool byClock = !run.run_name.time_type.empty();
+            const double time = byClock ? run.GetAdjustedRealTime() : run.GetAdjustedCPUTime();
             const auto [known, isNew] = times_.emplace(run.run_name.function_name, time);
             if (!isNew && time < known->second) known->second = time;
         }
@@ -38,7 +39,19 @@ std::string Name(std::size_t row, bool engine) {
     return std::to_string(row) + (engine ? ":engine" : ":rival");
 }
 
-void AddTimings(const Row& row, bool isShare, const std::function<void()>& prepare,
+std::string Figure(const TableRow& row, std::size_t index, const Shortest& shortest) {
+    if (!row.figure.empty()) return row.figure;
+    const double engine = shortest.time(Name(index, true));
+    const double rival = shortest.time(Name(index, false));
+    std::string times = " (" + Rounded(engine / 1000) + " : " + Rounded(rival / 1000) + " µs)";
+    return (row.compared == Compared::Ratio ? Rounded(rival / engine) + " ×"
+                                            : Rounded(engine / rival)) +
+           times;
+}
+
+}  // namespace
+
+void AddTimings(const Row& row, Compared compared, const std::function<void()>& prepare,
                 const std::function<void()>& engine, const std::function<void()>& rival,
                 int calls) {
     for (const bool isEngine : {true, false}) {
@@ -48,38 +61,19 @@ void AddTimings(const Row& row, bool isShare, const std::function<void()>& prepa
             for (auto _ : state) call();
         };
         auto* added = benchmark::RegisterBenchmark(Name(Rows.size(), isEngine).c_str(), timing);
-        added->UseRealTime()->Unit(benchmark::kNanosecond)->Repetitions(5);
+        added->Unit(benchmark::kNanosecond)->Repetitions(5);
+        if (compared == Compared::ShareByClock) added->UseRealTime();
         if (calls > 0) {
             added->Iterations(calls);
         } else {
             added->MinTime(0.1);
         }
     }
-    Rows.push_back({row, "", isShare});
-}
-
-std::string Figure(const TableRow& row, std::size_t index, const Shortest& shortest) {
-    if (!row.figure.empty()) return row.figure;
-    const double engine = shortest.time(Name(index, true));
-    const double rival = shortest.time(Name(index, false));
-    std::string times = " (" + Rounded(engine / 1000) + " : " + Rounded(rival / 1000) + " µs)";
-    return (row.isShare ? Rounded(engine / rival) : Rounded(rival / engine) + " ×") + times;
-}
-
-}  // namespace
-
-void AddRatio(const Row& row, const std::function<void()>& prepare,
-              const std::function<void()>& engine, const std::function<void()>& rival, int calls) {
-    AddTimings(row, false, prepare, engine, rival, calls);
-}
-
-void AddShare(const Row& row, const std::function<void()>& prepare,
-              const std::function<void()>& engine, const std::function<void()>& rival, int calls) {
-    AddTimings(row, true, prepare, engine, rival, calls);
+    Rows.push_back({row, "", compared});
 }
 
 void AddFigure(const Row& row, const std::string& figure) {
-    Rows.push_back({row, figure, false});
+    Rows.push_back({row, figure, Compared::Ratio});
 }
 
 std::string Rounded(double value, const std::string& unit) {

@@ -11,16 +11,16 @@ struct Row {
     std::string aim;
 };
 
-/// A row of two timings: the rival's time for one call over the engine's. Before each timing
-/// `prepare` runs, untimed; `calls` is how many calls one timing makes (0: as many as it takes).
-void AddRatio(const Row& row, const std::function<void()>& prepare,
-              const std::function<void()>& engine, const std::function<void()>& rival,
-              int calls = 0);
+/// How a row's two timings are compared. Time is the processor's, which other programs on the
+/// machine disturb least, or that of the clock where a rival is a program of its own.
+enum class Compared { Ratio, Share, ShareByClock };
 
-/// The same, as the engine's time over the rival's.
-void AddShare(const Row& row, const std::function<void()>& prepare,
-              const std::function<void()>& engine, const std::function<void()>& rival,
-              int calls = 0);
+/// A row of two timings: the rival's time over the engine's, or as a share the other way round.
+/// Before each timing `prepare` runs, untimed; `calls` is how many calls one timing makes
+/// (0: as many as it takes).
+void AddTimings(const Row& row, Compared compared, const std::function<void()>& prepare,
+                const std::function<void()>& engine, const std::function<void()>& rival,
+                int calls = 0);
 
 /// A row of a figure that is measured at once.
 void AddFigure(const Row& row, const std::string& figure);

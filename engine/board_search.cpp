@@ -115,7 +115,7 @@ inline std::size_t BoardSearch::State::matchBlock(const Match& match, const Chai
             match(nodes[chain->node]) & Touching[chain->cube] & ~std::uint32_t{chain->used};
         *last = {chain, cubesLeft};
         last += cubesLeft != 0 ? 1 : 0;
-        count += static_cast<std::size_t>(std::popcount(cubesLeft));
+        count += EdgeCount(cubesLeft);
     }
     return count;
 }
@@ -128,8 +128,9 @@ inline void BoardSearch::State::growBlock(std::size_t count, Output& out) {
     for (; count > 0; --count) {
         grow(*from->chain, static_cast<std::uint32_t>(std::countr_zero(cubesLeft)), out);
         cubesLeft &= cubesLeft - 1;
-        from += cubesLeft == 0 ? 1 : 0;
-        cubesLeft = cubesLeft == 0 ? from->cubesLeft : cubesLeft;
+        const std::uint32_t done = cubesLeft == 0 ? 1 : 0;
+        from += done;
+        cubesLeft |= from->cubesLeft & (0 - done);
     }
 }
 
@@ -145,7 +146,7 @@ inline void BoardSearch::State::grow(const Chain& chain, std::uint32_t cube, Out
     __builtin_prefetch(nodes + step.node);
     *out.chains = {step.node, step.firstWord, static_cast<std::uint16_t>(chain.used | (1U << cube)),
                    static_cast<std::uint8_t>(cube), static_cast<std::uint8_t>(step.letters)};
-    out.chains += step.node != NoNode && step.letters < maxLetters ? 1 : 0;
+    out.chains += (step.node != NoNode ? 1U : 0U) & (step.letters < maxLetters ? 1U : 0U);
 }
 
 // Goes along the letter, which the node has.
@@ -156,13 +157,14 @@ inline void BoardSearch::State::take(Step& step, std::uint32_t bit, Output& out)
     ++step.letters;
     step.firstWord += link[1];
     *out.words = step.firstWord;
-    out.words += isWord != 0 && step.letters >= minLetters && step.letters <= maxLetters ? 1 : 0;
+    out.words += isWord & (step.letters - minLetters <= maxLetters - minLetters ? 1U : 0U);
     step.firstWord += isWord;
     step.node = ChildOf(link[0]);
 }
 
 // Drops the chains from `begin` on that need not be extended.
-void BoardSearch::State::thinOut(Level& level, std::size_t begin, std::size_t& end) {
+[[gnu::noinline]] void BoardSearch::State::thinOut(Level& level, std::size_t begin,
+                                                   std::size_t& end) {
     Exhaustion exhaustion(nodes, found, minLetters, maxLetters);
     const auto isIdle = [&](const Chain& chain) {
         return exhaustion.holds(chain.node, chain.firstWord, chain.letters) ||
@@ -254,7 +256,7 @@ const std::vector<std::uint32_t>& BoardSearch::search(const WordGraph& graph, co
     state.minLetters = static_cast<std::uint32_t>(limits.minLetters);
     state.maxLetters = static_cast<std::uint32_t>(limits.maxLetters);
     state.levels[0].chains[0] = {graph.root(), 0, 0, NoCube, 0};
-    state.levels[0].count = 1;
+    state.levels[0].count = limits.minLetters <= limits.maxLetters ? 1 : 0;
     switch (matching_) {
 #if defined(__x86_64__)
         case Matching::Avx512:

@@ -5,9 +5,33 @@
 // Links lead to nodes read before, so there are no cycles; words and heights add up as the nodes
 // come, so no walk of the finished graph is needed to know that it is sound.
 
+inline std::uint32_t CodeReader::readFour() {
+    std::uint32_t value = 0;
+    for (int i = 0; i < 4; ++i) value |= std::to_integer<std::uint32_t>(*at_++) << (8 * i);
+    return value;
+}
+
+inline bool CodeReader::read(std::uint32_t& code) {
+    if (at_ == end_) return false;
+    const auto first = std::to_integer<std::uint32_t>(*at_++);
+    if (first < OneByteCodes) {
+        code = first;
+        return true;
+    }
+    if (first < LongCode) {
+        if (at_ == end_) return false;
+        code =
+            OneByteCodes + ((first - OneByteCodes) << 8) + std::to_integer<std::uint32_t>(*at_++);
+        return true;
+    }
+    if (end_ - at_ < 4) return false;
+    code = readFour();
+    return true;
+}
+
 DictionaryDecoder::DictionaryDecoder(const DictionaryHeader& header,
                                      std::span<const std::byte> bytes)
-    : header_(header), at_(bytes.data()), end_(bytes.data() + bytes.size()) {}
+    : header_(header), codes_(bytes) {}
 
 std::shared_ptr<NodeStore> DictionaryDecoder::read() {
     if (!plausible()) return nullptr;
@@ -24,7 +48,7 @@ std::shared_ptr<NodeStore> DictionaryDecoder::read() {
 
 // The counts against the bytes there are, before any memory is asked for.
 bool DictionaryDecoder::plausible() const {
-    const auto bytes = static_cast<std::size_t>(end_ - at_);
+    const std::size_t bytes = codes_.left();
     const std::size_t tables = 4 * (std::size_t{header_.masks} + header_.hotLinks);
     return header_.masks <= MostMasks && header_.hotLinks <= MostHotLinks && tables <= bytes &&
            std::size_t{header_.nodes} + header_.edges + header_.shared <= bytes - tables;
@@ -32,28 +56,13 @@ bool DictionaryDecoder::plausible() const {
 
 void DictionaryDecoder::readTables() {
     masks_.resize(header_.masks);
-    for (std::uint32_t& mask : masks_) mask = readFour();
+    for (std::uint32_t& mask : masks_) mask = codes_.readFour();
     hotLinks_.resize(header_.hotLinks);
-    for (std::uint32_t& link : hotLinks_) link = readFour();
+    for (std::uint32_t& link : hotLinks_) link = codes_.readFour();
     shared_.resize(header_.shared);
 }
 
-bool DictionaryDecoder::readNodes() {
-    while (at_ != end_) {
-        std::uint32_t code = 0;
-        const bool isLong = *at_ == std::byte{LongCode};
-        if (!readCode(code)) return false;
-        if (!isLong && code == ShareCode) {
-            if (!share()) return false;
-            continue;
-        }
-        if (!isLong && code - FirstMaskCode >= masks_.size()) return false;
-        if (!readNode(isLong ? code : masks_[code - FirstMaskCode])) return false;
-    }
-    return true;
-}
-
-bool DictionaryDecoder::readNode(std::uint32_t mask) {
+inline bool DictionaryDecoder::readNode(CodeReader& codes, std::uint32_t mask) {
     const std::size_t size = 1 + 2 * std::size_t{EdgeCount(mask)};
     if (mask == 0 || mask >> Letters != 0 || size > all_ - used_) return false;
     std::uint32_t* cell = cells_ + used_;
@@ -63,7 +72,7 @@ bool DictionaryDecoder::readNode(std::uint32_t mask) {
     for (const std::uint32_t* end = cells_ + used_ + size; cell != end;) {
         Read child{};
         std::uint32_t wordEnds = 0;
-        if (!readLink(child, wordEnds)) return false;
+        if (!readLink(codes, child, wordEnds)) return false;
         *cell++ = child.node | (wordEnds << 31);
         *cell++ = static_cast<std::uint32_t>(words);
         words += wordEnds + child.words;
@@ -76,9 +85,9 @@ bool DictionaryDecoder::readNode(std::uint32_t mask) {
     return true;
 }
 
-bool DictionaryDecoder::readLink(Read& child, std::uint32_t& wordEnds) {
+inline bool DictionaryDecoder::readLink(CodeReader& codes, Read& child, std::uint32_t& wordEnds) {
     std::uint32_t code = 0;
-    if (!readCode(code)) return false;
+    if (!codes.read(code)) return false;
     if (code == EndCode) {
         wordEnds = 1;
         return true;
@@ -98,9 +107,25 @@ bool DictionaryDecoder::readLink(Read& child, std::uint32_t& wordEnds) {
     return true;
 }
 
-bool DictionaryDecoder::share() {
+inline bool DictionaryDecoder::share() {
     if (waitingCount_ == 0 || sharedCount_ == shared_.size()) return false;
     shared_[sharedCount_++] = waiting_[waitingCount_ - 1];
+    return true;
+}
+
+[[gnu::flatten]] bool DictionaryDecoder::readNodes() {
+    CodeReader codes = codes_;  // kept in registers here
+    while (codes.left() > 0) {
+        std::uint32_t code = 0;
+        const bool isLong = codes.isLong();
+        if (!codes.read(code)) return false;
+        if (!isLong && code == ShareCode) {
+            if (!share()) return false;
+            continue;
+        }
+        if (!isLong && code - FirstMaskCode >= masks_.size()) return false;
+        if (!readNode(codes, isLong ? code : masks_[code - FirstMaskCode])) return false;
+    }
     return true;
 }
 
@@ -114,28 +139,4 @@ bool DictionaryDecoder::finished() const {
         if ((root[1 + 2 * i] & WordEnds) != 0) return false;
     }
     return true;
-}
-
-bool DictionaryDecoder::readCode(std::uint32_t& code) {
-    if (at_ == end_) return false;
-    const auto first = std::to_integer<std::uint32_t>(*at_++);
-    if (first < OneByteCodes) {
-        code = first;
-        return true;
-    }
-    if (first < LongCode) {
-        if (at_ == end_) return false;
-        code =
-            OneByteCodes + ((first - OneByteCodes) << 8) + std::to_integer<std::uint32_t>(*at_++);
-        return true;
-    }
-    if (end_ - at_ < 4) return false;
-    code = readFour();
-    return true;
-}
-
-std::uint32_t DictionaryDecoder::readFour() {
-    std::uint32_t value = 0;
-    for (int i = 0; i < 4; ++i) value |= std::to_integer<std::uint32_t>(*at_++) << (8 * i);
-    return value;
 }

@@ -10,6 +10,23 @@
 #include "dictionary_codes.h"
 #include "node_store.h"
 
+/// Takes codes off the front of bytes.
+class CodeReader {
+  public:
+    explicit CodeReader(std::span<const std::byte> bytes)
+        : at_(bytes.data()), end_(bytes.data() + bytes.size()) {}
+
+    std::size_t left() const { return static_cast<std::size_t>(end_ - at_); }
+    bool isLong() const { return *at_ == std::byte{LongCode}; }
+    bool read(std::uint32_t& code);
+    /// A number of four bytes, which must be there.
+    std::uint32_t readFour();
+
+  private:
+    const std::byte* at_;
+    const std::byte* end_;
+};
+
 class DictionaryDecoder {
   public:
     /// `bytes`: what follows the header.
@@ -31,16 +48,13 @@ class DictionaryDecoder {
     bool plausible() const;
     void readTables();
     bool readNodes();
-    bool readNode(std::uint32_t mask);
-    bool readLink(Read& child, std::uint32_t& wordEnds);
+    bool readNode(CodeReader& codes, std::uint32_t mask);
+    bool readLink(CodeReader& codes, Read& child, std::uint32_t& wordEnds);
     bool share();
     bool finished() const;
-    bool readCode(std::uint32_t& code);
-    std::uint32_t readFour();
 
     const DictionaryHeader& header_;
-    const std::byte* at_;
-    const std::byte* end_;
+    CodeReader codes_;
     std::shared_ptr<NodeStore> store_;
     std::uint32_t* cells_ = nullptr;
     std::size_t used_ = 1;  // cells written

@@ -30,8 +30,12 @@ inline constexpr int LongestWord = 16;
 inline NodeIndex ChildOf(std::uint32_t link) {
     return link & ~WordEnds;
 }
+/// Written out, because where the processor is not known to count bits the library would be called;
+/// where it is, the compiler knows this form.
 inline std::uint32_t EdgeCount(std::uint32_t mask) {
-    return static_cast<std::uint32_t>(std::popcount(mask));
+    mask -= (mask >> 1) & 0x55555555;
+    mask = (mask & 0x33333333) + ((mask >> 2) & 0x33333333);
+    return (((mask + (mask >> 4)) & 0x0f0f0f0f) * 0x01010101) >> 24;
 }
 /// The bit of a lower-case letter in a mask.
 inline std::uint32_t LetterBit(char letter) {

@@ -3,29 +3,40 @@
 #include <utility>
 
 WordReader::WordReader(WordGraph graph) : graph_(std::move(graph)) {
-    steps_[0] = {graph_.root(), 0, graph_.size(), false};
+    steps_[0] = stepTo(graph_.root(), 0, graph_.size(), 0);
 }
 
 std::string_view WordReader::word(std::uint32_t index) {
-    while (index < steps_[depth_].begin || index >= steps_[depth_].end) --depth_;
-    while (!steps_[depth_].isWord || index != steps_[depth_].begin) descend(index);
+    if (index < steps_[depth_].begin) {
+        depth_ = 0;
+        steps_[0] = stepTo(graph_.root(), 0, graph_.size(), 0);
+    }
+    while (index >= steps_[depth_].end) --depth_;
+    while (steps_[depth_].isWord == 0 || index != steps_[depth_].begin) descend(index);
     return {letters_.data(), depth_};
 }
 
-// Goes one letter further towards the word.
+WordReader::Step WordReader::stepTo(NodeIndex node, std::uint32_t begin, std::uint32_t end,
+                                    std::uint32_t isWord) const {
+    return {begin, end, isWord, graph_.nodes()[node], node + 1};
+}
+
+// Goes one letter further towards the word: the last one whose words do not begin after it.
 void WordReader::descend(std::uint32_t index) {
-    const Step& step = steps_[depth_];
-    const std::uint32_t* node = graph_.nodes() + step.node;
-    const std::uint32_t first = step.begin + (step.isWord ? 1 : 0);
+    const std::uint32_t* nodes = graph_.nodes();
+    Step& step = steps_[depth_];
+    const std::uint32_t first = step.begin + step.isWord;
     std::uint32_t end = step.end;
-    std::uint32_t left = node[0];
-    // The last letter whose words do not begin after this one.
-    const std::uint32_t* edge = node + 2 * EdgeCount(left) - 1;
-    while (first + edge[1] > index) {
-        end = first + edge[1];
-        left ^= std::bit_floor(left);
-        edge -= 2;
+    for (std::uint32_t later = step.left & (step.left - 1); later != 0; later &= later - 1) {
+        const std::uint32_t next = first + nodes[step.link + 3];
+        if (next > index) {
+            end = next;
+            break;
+        }
+        step.left = later;
+        step.link += 2;
     }
-    letters_[depth_++] = static_cast<char>('a' + std::bit_width(left) - 1);
-    steps_[depth_] = {ChildOf(edge[0]), first + edge[1], end, (edge[0] & WordEnds) != 0};
+    letters_[depth_++] = static_cast<char>('a' + std::countr_zero(step.left));
+    const std::uint32_t link = nodes[step.link];
+    steps_[depth_] = stepTo(ChildOf(link), first + nodes[step.link + 1], end, link >> 31);
 }

@@ -5,7 +5,7 @@
 
 #include "word_graph.h"
 
-/// Remembers where it stands, so that a word near the one before is found in a few steps.
+/// Remembers where it stands: words asked for in ascending order take a few steps each.
 class WordReader {
   public:
     WordReader() = default;
@@ -17,12 +17,14 @@ class WordReader {
   private:
     // The words that begin with the first letters: begin to end - 1, the letters' own first.
     struct Step {
-        NodeIndex node = NoNode;
         std::uint32_t begin = 0;
         std::uint32_t end = 0;
-        bool isWord = false;
+        std::uint32_t isWord = 0;
+        std::uint32_t left = 0;  // the letters that may come next, from the one tried last
+        NodeIndex link = 0;      // where that one's link stands
     };
 
+    Step stepTo(NodeIndex node, std::uint32_t begin, std::uint32_t end, std::uint32_t isWord) const;
     void descend(std::uint32_t index);
 
     WordGraph graph_;
