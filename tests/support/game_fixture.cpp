@@ -12,8 +12,6 @@ namespace {
 
 constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
 
-std::function<float()> DesktopRandomness;
-
 }  // namespace
 
 void UseHome(const std::string& folder) {
@@ -28,7 +26,6 @@ GameFixture::GameFixture() {
     UseHome(folder_.path());
     std::filesystem::create_directory(folder_ / "program");
     resetProcess();
-    if (!DesktopRandomness) DesktopRandomness = Platform::RandomNumber;
     useTestDesktop();
 }
 
@@ -37,11 +34,6 @@ void GameFixture::resetProcess() {
     cDictionaryClear();
     cSetMinWordSize(3);
     cSetMaxWordSize(16);
-}
-
-void GameFixture::useDesktopRandomness() {
-    Platform::SeedRandom();
-    Platform::RandomNumber = DesktopRandomness;
 }
 
 void GameFixture::useTestDesktop() {

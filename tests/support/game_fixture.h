@@ -29,9 +29,6 @@ class GameFixture : public testing::Test {
     /// show something.
     void useTestDesktop();
 
-    /// Gives the program its own random source back, seeded.
-    static void useDesktopRandomness();
-
     /// Puts letters on the board as a shake would, without a window.
     static void putOnBoard(const std::string& board);
 
