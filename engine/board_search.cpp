@@ -68,15 +68,18 @@ struct Growing {
     std::uint32_t cubesLeft;
 };
 
+/// Chains of as many cubes as the level's number, one behind the other.
 struct Level {
-    std::array<Chain, Block * MostTouching + 1> chains;
-    std::size_t count;
+    Chain* begin;
+    Chain* end;
 };
 
 }  // namespace
 
 struct BoardSearch::State {
-    // Level i: chains of i cubes that wait to be extended. The last is never reached.
+    // The chains that wait to be extended, level behind level: a stack, of which each level takes
+    // what one block can grow to. One chain more may be written and not counted.
+    std::array<Chain, (Cubes + 1) * Block * MostTouching + 1> chains;
     std::array<Level, Cubes + 2> levels;
     CubeBits cubes;
     RankSet found;
@@ -97,10 +100,10 @@ struct BoardSearch::State {
     void grow(const Chain& chain, std::uint32_t cube, Output& out) const;
     void take(Step& step, std::uint32_t bit, Output& out) const;
     template <class Match>
-    void extendBlock(const Match& match, const Chain* chain, const Chain* end, Level& longer);
+    Chain* extendBlock(const Match& match, const Chain* chain, const Chain* end, Chain* to);
     template <class Match>
     void run();
-    void thinOut(Level& level, std::size_t begin, std::size_t& end);
+    Chain* thinOut(Chain* begin, Chain* end);
 };
 
 // Finds the cubes that each chain of the block can go on with, and gathers the chains that have
@@ -162,52 +165,46 @@ inline void BoardSearch::State::take(Step& step, std::uint32_t bit, Output& out)
     step.node = ChildOf(link[0]);
 }
 
-// Drops the chains from `begin` on that need not be extended.
-[[gnu::noinline]] void BoardSearch::State::thinOut(Level& level, std::size_t begin,
-                                                   std::size_t& end) {
+// Drops the chains that need not be extended, and returns the new end.
+[[gnu::noinline]] Chain* BoardSearch::State::thinOut(Chain* begin, Chain* end) {
     Exhaustion exhaustion(nodes, found, minLetters, maxLetters);
-    const auto isIdle = [&](const Chain& chain) {
+    return std::remove_if(begin, end, [&](const Chain& chain) {
         return exhaustion.holds(chain.node, chain.firstWord, chain.letters) ||
                !recent.add(chain.firstWord, chain.letters, chain.used, chain.cube);
-    };
-    Chain* first = level.chains.data() + begin;
-    Chain* last = level.chains.data() + end;
-    end = begin + static_cast<std::size_t>(std::remove_if(first, last, isIdle) - first);
+    });
 }
 
+// Writes the longer chains to `to` and returns their end.
 template <class Match>
-inline void BoardSearch::State::extendBlock(const Match& match, const Chain* chain,
-                                            const Chain* end, Level& longer) {
-    Output out{longer.chains.data(), words.data()};
+inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* chain,
+                                              const Chain* end, Chain* to) {
+    Output out{to, words.data()};
     growBlock(matchBlock(match, chain, end), out);
-    longer.count = static_cast<std::size_t>(out.chains - longer.chains.data());
     for (const std::uint32_t* word = words.data(); word != out.words; ++word) found.insert(*word);
+    return out.chains;
 }
 
 template <class Match>
 inline void BoardSearch::State::run() {
     const Match match(cubes);
-    std::size_t length = 0;
     std::size_t extended = 0;
     bool isHard = false;
-    while (true) {
-        Level& level = levels[length];
-        if (level.count == 0) {
-            if (length == 0) return;
-            --length;
+    for (Level* level = levels.data();;) {
+        if (level->begin == level->end) {
+            if (level == levels.data()) return;
+            --level;
             continue;
         }
-        std::size_t end = level.count;
-        level.count -= std::min(end, Block);
-        if (isHard) thinOut(level, level.count, end);
-        extended += end - level.count;
+        Chain* const levelEnd = level->end;
+        level->end -= std::min(levelEnd - level->begin, std::ptrdiff_t{Block});
+        Chain* const end = isHard ? thinOut(level->end, levelEnd) : levelEnd;
+        Chain* const longer = extendBlock(match, level->end, end, levelEnd);
+        extended += static_cast<std::size_t>(end - level->end);
         if (!isHard && extended >= HardAfter) {
             isHard = true;
             recent.clear();
         }
-        extendBlock(match, level.chains.data() + level.count, level.chains.data() + end,
-                    levels[length + 1]);
-        ++length;
+        *++level = {levelEnd, longer};
     }
 }
 
@@ -241,9 +238,7 @@ Matching BestMatching() {
     return CanMatch(Matching::Avx2) ? Matching::Avx2 : Matching::Plain;
 }
 
-BoardSearch::BoardSearch(Matching matching) : matching_(matching), state_(new State) {
-    for (Level& level : state_->levels) level.count = 0;
-}
+BoardSearch::BoardSearch(Matching matching) : matching_(matching), state_(new State) {}
 
 BoardSearch::~BoardSearch() = default;
 
@@ -255,8 +250,9 @@ const std::vector<std::uint32_t>& BoardSearch::search(const WordGraph& graph, co
     state.nodes = graph.nodes();
     state.minLetters = static_cast<std::uint32_t>(limits.minLetters);
     state.maxLetters = static_cast<std::uint32_t>(limits.maxLetters);
-    state.levels[0].chains[0] = {graph.root(), 0, 0, NoCube, 0};
-    state.levels[0].count = limits.minLetters <= limits.maxLetters ? 1 : 0;
+    state.chains[0] = {graph.root(), 0, 0, NoCube, 0};
+    const bool canFind = limits.minLetters <= limits.maxLetters;
+    state.levels[0] = {state.chains.data(), state.chains.data() + (canFind ? 1 : 0)};
     switch (matching_) {
 #if defined(__x86_64__)
         case Matching::Avx512:

@@ -11,21 +11,26 @@ inline std::uint32_t CodeReader::readFour() {
     return value;
 }
 
+// Codes of one and two bytes alternate at random: they are told apart without a branch.
 inline bool CodeReader::read(std::uint32_t& code) {
-    if (at_ == end_) return false;
-    const auto first = std::to_integer<std::uint32_t>(*at_++);
-    if (first < OneByteCodes) {
-        code = first;
+    if (left() < 2 || isLong()) return readSlowly(code);
+    const auto first = std::to_integer<std::uint32_t>(at_[0]);
+    const auto second = std::to_integer<std::uint32_t>(at_[1]);
+    const std::uint32_t isTwo = first >= OneByteCodes ? 1 : 0;
+    code = first + ((0 - isTwo) & (((first - OneByteCodes) << 8) + second + OneByteCodes - first));
+    at_ += 1 + isTwo;
+    return true;
+}
+
+// The last byte of all, and codes of five bytes.
+bool CodeReader::readSlowly(std::uint32_t& code) {
+    if (isLong() && left() >= 5) {
+        ++at_;
+        code = readFour();
         return true;
     }
-    if (first < LongCode) {
-        if (at_ == end_) return false;
-        code =
-            OneByteCodes + ((first - OneByteCodes) << 8) + std::to_integer<std::uint32_t>(*at_++);
-        return true;
-    }
-    if (end_ - at_ < 4) return false;
-    code = readFour();
+    if (left() == 0 || *at_ >= std::byte{OneByteCodes}) return false;
+    code = std::to_integer<std::uint32_t>(*at_++);
     return true;
 }
 
@@ -40,8 +45,7 @@ std::shared_ptr<NodeStore> DictionaryDecoder::read() {
     store_->reserve(all_ - 1);
     store_->append(all_ - 1);
     cells_ = store_->words();
-    readTables();
-    if (!readNodes() || !finished()) return nullptr;
+    if (!readTables() || !readNodes() || !finished()) return nullptr;
     store_->closeBase(header_.nodes == 0 ? NoNode : waiting_[0].node);
     return std::move(store_);
 }
@@ -54,12 +58,21 @@ bool DictionaryDecoder::plausible() const {
            std::size_t{header_.nodes} + header_.edges + header_.shared <= bytes - tables;
 }
 
-void DictionaryDecoder::readTables() {
+bool DictionaryDecoder::readTables() {
     masks_.resize(header_.masks);
     for (std::uint32_t& mask : masks_) mask = codes_.readFour();
-    hotLinks_.resize(header_.hotLinks);
-    for (std::uint32_t& link : hotLinks_) link = codes_.readFour();
-    shared_.resize(header_.shared);
+    known_.resize(1 + std::size_t{header_.shared});
+    shortLinks_[EndCode] = NothingKnown + 1;
+    shortLinks_[NewWordCode] = 1;
+    std::uint32_t code = FirstSharedCode;
+    for (std::uint32_t i = 0; i < header_.hotLinks; ++i) {
+        const std::uint32_t link = codes_.readFour();
+        if (link >> 1 >= header_.shared) return false;
+        shortLinks_[code++] = FirstKnown + link;
+    }
+    firstNumber_ = code;
+    for (; code < OneByteCodes; ++code) shortLinks_[code] = FirstKnown + code - firstNumber_;
+    return true;
 }
 
 inline bool DictionaryDecoder::readNode(CodeReader& codes, std::uint32_t mask) {
@@ -85,31 +98,25 @@ inline bool DictionaryDecoder::readNode(CodeReader& codes, std::uint32_t mask) {
     return true;
 }
 
+// All kinds of links in one way, because which comes next cannot be foreseen.
 inline bool DictionaryDecoder::readLink(CodeReader& codes, Read& child, std::uint32_t& wordEnds) {
     std::uint32_t code = 0;
     if (!codes.read(code)) return false;
-    if (code == EndCode) {
-        wordEnds = 1;
-        return true;
-    }
-    if (code < FirstSharedCode) {
-        wordEnds = code - NewChildCode;
-        if (waitingCount_ == 0) return false;
-        child = waiting_[--waitingCount_];
-        return true;
-    }
-    code -= FirstSharedCode;
-    code = code < hotLinks_.size() ? hotLinks_[code]
-                                   : code - static_cast<std::uint32_t>(hotLinks_.size());
-    wordEnds = code & 1;
-    if (code >> 1 >= sharedCount_) return false;
-    child = shared_[code >> 1];
+    const std::uint32_t link = code < OneByteCodes ? shortLinks_[code & (OneByteCodes - 1)]
+                                                   : FirstKnown + (code - firstNumber_);
+    const std::uint32_t isNew = code - NewChildCode < 2 ? 1 : 0;
+    if (isNew > waitingCount_ || link >> 1 > sharedCount_) return false;
+    const Read* waiting = waiting_.data() + waitingCount_ - isNew;
+    const Read* known = known_.data() + (link >> 1);
+    child = *(isNew != 0 ? waiting : known);
+    wordEnds = link & 1;
+    waitingCount_ -= isNew;
     return true;
 }
 
 inline bool DictionaryDecoder::share() {
-    if (waitingCount_ == 0 || sharedCount_ == shared_.size()) return false;
-    shared_[sharedCount_++] = waiting_[waitingCount_ - 1];
+    if (waitingCount_ == 0 || sharedCount_ == header_.shared) return false;
+    known_[++sharedCount_] = waiting_[waitingCount_ - 1];
     return true;
 }
 
@@ -131,7 +138,7 @@ inline bool DictionaryDecoder::share() {
 
 // Exactly one node has no parent, all counts are used up, and no word has one letter only.
 bool DictionaryDecoder::finished() const {
-    if (used_ != all_ || sharedCount_ != shared_.size()) return false;
+    if (used_ != all_ || sharedCount_ != header_.shared) return false;
     if (header_.nodes == 0) return header_.words == 0 && waitingCount_ == 0;
     if (waitingCount_ != 1 || waiting_[0].words != header_.words) return false;
     const std::uint32_t* root = cells_ + waiting_[0].node;

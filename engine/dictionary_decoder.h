@@ -17,12 +17,14 @@ class CodeReader {
         : at_(bytes.data()), end_(bytes.data() + bytes.size()) {}
 
     std::size_t left() const { return static_cast<std::size_t>(end_ - at_); }
-    bool isLong() const { return *at_ == std::byte{LongCode}; }
+    bool isLong() const { return at_ != end_ && *at_ == std::byte{LongCode}; }
     bool read(std::uint32_t& code);
     /// A number of four bytes, which must be there.
     std::uint32_t readFour();
 
   private:
+    bool readSlowly(std::uint32_t& code);
+
     const std::byte* at_;
     const std::byte* end_;
 };
@@ -46,7 +48,7 @@ class DictionaryDecoder {
     static constexpr std::size_t MostWaiting = LongestWord * Letters;
 
     bool plausible() const;
-    void readTables();
+    bool readTables();
     bool readNodes();
     bool readNode(CodeReader& codes, std::uint32_t mask);
     bool readLink(CodeReader& codes, Read& child, std::uint32_t& wordEnds);
@@ -60,9 +62,13 @@ class DictionaryDecoder {
     std::size_t used_ = 1;  // cells written
     std::size_t all_ = 1;   // cells that the header promises
     std::vector<std::uint32_t> masks_;
-    std::vector<std::uint32_t> hotLinks_;
-    std::vector<Read> shared_;
+    // A link is twice an index into known_, plus 1 when a word ends.
+    static constexpr std::uint32_t NothingKnown = 0;
+    static constexpr std::uint32_t FirstKnown = 2;
+    std::array<std::uint32_t, OneByteCodes> shortLinks_{};  // of the codes of one byte
+    std::uint32_t firstNumber_ = 0;                         // the code of number 0
+    std::vector<Read> known_;  // nothing, then the shared nodes by number
     std::size_t sharedCount_ = 0;
-    std::array<Read, MostWaiting> waiting_;
+    std::array<Read, MostWaiting + 1> waiting_;
     std::size_t waitingCount_ = 0;
 };
