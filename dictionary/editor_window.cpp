@@ -8,7 +8,6 @@
 #include <QListView>
 #include <QPushButton>
 #include <QStringListModel>
-#include <QStyle>
 
 #include "dictionary/editor_commands.h"
 #include "dictionary/listing.h"
@@ -42,9 +41,7 @@ QPushButton* MakeButton(QWidget* parent, const char* name, TwipsRect place, Qt::
 
 // The longest word fits beside the scroll bar, however wide the desktop has it.
 QFont FontForWords(const QListView& list) {
-    const int scrollBar = list.style()->pixelMetric(QStyle::PM_ScrollBarExtent);
-    const int room = list.width() - 2 * list.frameWidth() - scrollBar - CellPadding;
-    return Condensed(list.font(), QString(LongestWord, 'm'), room);
+    return Condensed(list.font(), QString(LongestWord, 'm'), RowTextWidth(list));
 }
 
 }  // namespace

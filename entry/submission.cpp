@@ -31,8 +31,7 @@ void ListWord(Main& window, const std::string& word) {
     const QString text = QString::fromStdString(word);
     list.insertRow(0);
     auto* cell = new QTableWidgetItem(text);
-    QFont font = Condensed(LayoutFont(Typeface::Courier, 18, true), text,
-                           list.viewport()->width() - CellPadding);
+    QFont font = Condensed(LayoutFont(Typeface::Courier, 18, true), text, RowTextWidth(list));
     if (!Dictionary::IsInDictionary(word)) {
         font.setStrikeOut(true);
         cell->setData(Qt::AccessibleDescriptionRole, "not in dictionary");

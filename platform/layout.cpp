@@ -1,11 +1,13 @@
 #include "platform/layout.h"
 
 #include <QAbstractButton>
+#include <QAbstractScrollArea>
 #include <QApplication>
 #include <QFontMetrics>
 #include <QKeyEvent>
 #include <QLabel>
 #include <QMenuBar>
+#include <QStyle>
 #include <QVariant>
 #include <cmath>
 
@@ -13,6 +15,7 @@ namespace {
 
 constexpr double PixelsPerPoint = 96.0 / 72.0;
 constexpr int PlainFontPixels = 11;
+constexpr int CellPadding = 8;
 constexpr const char* DefaultButtonProperty = "defaultButton";
 
 QFont FontOf(Typeface typeface, int pixels, bool bold) {
@@ -95,4 +98,9 @@ QFont Condensed(QFont font, const QString& text, int width) {
     const int natural = QFontMetrics(font).horizontalAdvance(text);
     if (natural > width) font.setStretch(QFont::Unstretched * width / natural);
     return font;
+}
+
+int RowTextWidth(const QAbstractScrollArea& list) {
+    const int scrollBar = list.style()->pixelMetric(QStyle::PM_ScrollBarExtent);
+    return list.width() - 2 * list.frameWidth() - scrollBar - CellPadding;
 }

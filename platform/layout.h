@@ -5,6 +5,7 @@
 #include <QFont>
 
 class QAbstractButton;
+class QAbstractScrollArea;
 class QLabel;
 class QWidget;
 
@@ -50,5 +51,5 @@ void SetDefaultButton(QWidget* window, QAbstractButton* button);
 /// does not by itself.
 QFont Condensed(QFont font, const QString& text, int width);
 
-/// What a list or grid cell keeps free beside its text, in logical pixels.
-constexpr int CellPadding = 8;
+/// The room for text in a list's or grid's row, beside its scroll bar.
+int RowTextWidth(const QAbstractScrollArea& list);

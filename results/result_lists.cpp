@@ -15,8 +15,7 @@ const QColor LitColour(128, 255, 128);
 
 void AddWord(QListWidget& list, const QString& word) {
     auto* item = new QListWidgetItem(word);
-    const int room = list.width() - 2 * list.frameWidth() - CellPadding;
-    const QFont fitting = Condensed(list.font(), word, room);
+    const QFont fitting = Condensed(list.font(), word, RowTextWidth(list));
     if (fitting != list.font()) item->setFont(fitting);
     if (fitting.strikeOut()) item->setData(Qt::AccessibleDescriptionRole, "not in dictionary");
     list.addItem(item);
