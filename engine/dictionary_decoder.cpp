@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "populate.h"
+
 // Links lead to nodes read before, so there are no cycles; words and heights add up as the nodes
 // come, so no walk of the finished graph is needed to know that it is sound.
 
@@ -45,6 +47,7 @@ std::shared_ptr<NodeStore> DictionaryDecoder::read() {
     store_->reserve(all_ - 1);
     store_->append(all_ - 1);
     cells_ = store_->words();
+    Populate(cells_, all_ * sizeof *cells_);
     if (!readTables() || !readNodes() || !finished()) return nullptr;
     store_->closeBase(header_.nodes == 0 ? NoNode : waiting_[0].node);
     return std::move(store_);
@@ -61,6 +64,8 @@ bool DictionaryDecoder::plausible() const {
 bool DictionaryDecoder::readTables() {
     masks_.resize(header_.masks);
     for (std::uint32_t& mask : masks_) mask = codes_.readFour();
+    known_.reserve(1 + std::size_t{header_.shared});
+    Populate(known_.data(), known_.capacity() * sizeof known_[0]);
     known_.resize(1 + std::size_t{header_.shared});
     shortLinks_[EndCode] = NothingKnown + 1;
     shortLinks_[NewWordCode] = 1;

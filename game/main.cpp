@@ -1,7 +1,10 @@
 #include <QApplication>
 #include <QIcon>
 #include <QScreen>
+#include <QTimer>
+#include <chrono>
 
+#include "board/tile_picture.h"
 #include "game/main_window.h"
 #include "game/windows.h"
 #include "platform/platform.h"
@@ -14,6 +17,19 @@ void CentreOnScreen(QWidget& window) {
     window.move(screen.center() - QRect(QPoint(0, 0), window.size()).center());
 }
 
+// Left until the window is there: reading pictures would delay its first paint
+// by a tenth, and the first lit tile is not wanted before the first game.
+constexpr std::chrono::milliseconds AfterFirstPaint{100};
+
+void FinishWindow() {
+    QIcon icon;
+    for (const char* size : {"48", "128"}) icon.addFile(QString(":/quorle-%1.png").arg(size));
+    QApplication::setWindowIcon(icon);
+    const Main& window = Windows::Shared<Main>();
+    TilePicture(true, QString(), window.devicePixelRatioF(),
+                window.palette().color(QPalette::Window));
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -22,14 +38,12 @@ int main(int argc, char** argv) {
     QApplication::setDesktopFileName("quorle");
     // Hiding the last window shown must not end the program; closing Main does.
     QApplication::setQuitOnLastWindowClosed(false);
-    QIcon icon;
-    for (const char* size : {"48", "128"}) icon.addFile(QString(":/quorle-%1.png").arg(size));
-    QApplication::setWindowIcon(icon);
     Platform::UseDesktop();
     Main& window = Windows::Shared<Main>();
     CentreOnScreen(window);
     FollowSessionEnd([&window] { window.close(); });
     window.show();
+    QTimer::singleShot(AfterFirstPaint, &window, FinishWindow);
     const int result = QApplication::exec();
     Windows::DestroyAll();
     return result;

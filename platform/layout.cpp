@@ -20,15 +20,17 @@ constexpr const char* DefaultButtonProperty = "defaultButton";
 
 QFont FontOf(Typeface typeface, int pixels, bool bold) {
     QFont font;
+    // The Liberation fonts are as wide as Arial and Courier New, and part of every
+    // installation: first, they make the windows the same everywhere.
     switch (typeface) {
         case Typeface::SansSerif:
-            font.setFamilies({"MS Sans Serif", "Liberation Sans", "sans-serif"});
+            font.setFamilies({"Liberation Sans", "sans-serif"});
             break;
         case Typeface::Arial:
-            font.setFamilies({"Arial", "Liberation Sans", "sans-serif"});
+            font.setFamilies({"Liberation Sans", "Arial", "sans-serif"});
             break;
         case Typeface::Courier:
-            font.setFamilies({"Courier New", "Liberation Mono", "monospace"});
+            font.setFamilies({"Liberation Mono", "Courier New", "monospace"});
             font.setStyleHint(QFont::TypeWriter);
             break;
     }
