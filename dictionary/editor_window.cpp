@@ -80,7 +80,7 @@ void DictionaryEditor::makeMenu() {
 void DictionaryEditor::makeLists() {
     StartingLetters = new QComboBox(client_);
     SetUp(StartingLetters, "StartingLetters", {120, 120, 3855, 540}, WordFont());
-    StartingLetters->setAccessibleName("Starting letters");
+    StartingLetters->setAccessibleDescription("Starting letters");  // its name is its entry
     StartingLetters->setMaxVisibleItems(PrefixesInView);
     connect(StartingLetters, &QComboBox::currentIndexChanged, this,
             [] { Dictionary::ListWords(); });

@@ -92,6 +92,7 @@ void OptionsDialog::makeBoxes() {
     SoundsOption->setToolTip("Controls game sounds");
     TimeCombo->setEditable(true);
     TimeCombo->setCompleter(nullptr);
+    TimeCombo->lineEdit()->setAccessibleName("Game Time");
     TimeCombo->setInsertPolicy(QComboBox::NoInsert);
     connect(TimeCombo, &QComboBox::editTextChanged, this,
             [this](const QString& text) { SelectTyped(*TimeCombo, text); });

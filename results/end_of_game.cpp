@@ -66,7 +66,7 @@ void ShowResultBoard(Results& results) {
             cell == "qu" ? QString("Qu") : QString::fromStdString(cell).toUpper();
         results.ResultCubes[k]->setText(letter);
         results.ResultCubes[k]->setAccessibleName(letter);
-        LightResultCube(*results.ResultCubes[k], false);
+        LightResultCube(*results.ResultCubes[k], k, false);
     }
 }
 

@@ -55,10 +55,11 @@ Common::Tally TallyOf(const QListWidget& list) {
     return tally;
 }
 
-void LightResultCube(QLabel& cube, bool lit) {
+void LightResultCube(QLabel& cube, std::size_t k, bool lit) {
     QPalette palette = cube.palette();
     palette.setColor(QPalette::Window, lit ? LitColour : PlainColour);
     cube.setPalette(palette);
     cube.setProperty("selected", lit);
-    cube.setAccessibleDescription(lit ? "lit" : "");
+    const QString place = QString("Row %1, column %2").arg(k / 4 + 1).arg(k % 4 + 1);
+    cube.setAccessibleDescription(lit ? place + ", lit" : place);
 }

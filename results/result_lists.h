@@ -23,6 +23,6 @@ int IndexOf(const QListWidget& list, const QString& word);
 /// Words and points of a list.
 Common::Tally TallyOf(const QListWidget& list);
 
-/// Gives a cube of the small board its lit or its plain colour, and its property
-/// `selected`.
-void LightResultCube(QLabel& cube, bool lit);
+/// Gives cube `k` (0..15) of the small board its lit or its plain colour, and its
+/// property `selected`; its accessible description tells place and look.
+void LightResultCube(QLabel& cube, std::size_t k, bool lit);

@@ -39,7 +39,7 @@ void ShowResultPath(const QString& word) {
     CheckCubes::IsOnBoard(word.toStdString());
     const Results& results = Windows::Shared<Results>();
     for (std::size_t k = 0; k < CubeCount; ++k) {
-        LightResultCube(*results.ResultCubes[k], State.TracedPath[k / BoardSize][k % BoardSize]);
+        LightResultCube(*results.ResultCubes[k], k, State.TracedPath[k / BoardSize][k % BoardSize]);
     }
 }
 

@@ -131,8 +131,9 @@ void Results::makeBoard() {
         QPalette palette = cube->palette();
         palette.setColor(QPalette::WindowText, Qt::black);
         cube->setPalette(palette);
-        LightResultCube(*cube, false);
-        ResultCubes[static_cast<std::size_t>(k)] = cube;
+        const auto index = static_cast<std::size_t>(k);
+        LightResultCube(*cube, index, false);
+        ResultCubes[index] = cube;
     }
 }
 
