@@ -1,5 +1,6 @@
 #include "dictionary/progress_window.h"
 
+#include <QEvent>
 #include <QLabel>
 #include <QTimer>
 
@@ -27,10 +28,8 @@ Progress::Progress() {
     ProgressLabel = MakeLabel(this, "ProgressLabel", {480, 120, 3255, 375},
                               LayoutFont(Typeface::SansSerif, 13.5));
     ProgressIndicator = MakeLabel(this, "ProgressIndicator", {120, 600, 3975, 135}, PlainFont());
-    QPalette colours = ProgressIndicator->palette();
-    colours.setColor(QPalette::Window, BarColour);
-    ProgressIndicator->setPalette(colours);
     ProgressIndicator->setAutoFillBackground(true);
+    colourBar();
     DictionaryTimer = new QTimer(this);
     DictionaryTimer->setObjectName("DictionaryTimer");
     DictionaryTimer->setInterval(StepInterval);
@@ -46,4 +45,16 @@ void Progress::Display() {
 
 void Progress::HideDisplay() {
     hide();
+}
+
+void Progress::colourBar() {
+    QPalette colours = ProgressIndicator->palette();
+    colours.setColor(QPalette::Window, BarColour);
+    ProgressIndicator->setPalette(colours);
+}
+
+// Some desktops give every control a new palette when their colours change.
+void Progress::changeEvent(QEvent* event) {
+    QFrame::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange) QTimer::singleShot(0, this, &Progress::colourBar);
 }

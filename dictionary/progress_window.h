@@ -18,4 +18,10 @@ class Progress : public QFrame {
     QLabel* ProgressLabel = nullptr;
     QLabel* ProgressIndicator = nullptr;  ///< its width is the bar
     QTimer* DictionaryTimer = nullptr;    ///< runs while a merge waits for its next step
+
+  protected:
+    void changeEvent(QEvent* event) override;
+
+  private:
+    void colourBar();
 };

@@ -7,6 +7,7 @@
 #include "board/tile_picture.h"
 #include "game/main_window.h"
 #include "game/windows.h"
+#include "platform/legible_style.h"
 #include "platform/platform.h"
 #include "platform/session_end.h"
 
@@ -34,6 +35,9 @@ void FinishWindow() {
 
 int main(int argc, char** argv) {
     QApplication application(argc, argv);
+    QApplication::setStyle(new LegibleStyle);
+    // The texts are English and have their places; mirrored, "=>" would point back.
+    QApplication::setLayoutDirection(Qt::LeftToRight);
     QApplication::setApplicationName("quorle");
     QApplication::setDesktopFileName("quorle");
     // Hiding the last window shown must not end the program; closing Main does.

@@ -58,6 +58,7 @@ Common::Tally TallyOf(const QListWidget& list) {
 void LightResultCube(QLabel& cube, std::size_t k, bool lit) {
     QPalette palette = cube.palette();
     palette.setColor(QPalette::Window, lit ? LitColour : PlainColour);
+    palette.setColor(QPalette::WindowText, Qt::black);
     cube.setPalette(palette);
     cube.setProperty("selected", lit);
     const QString place = QString("Row %1, column %2").arg(k / 4 + 1).arg(k % 4 + 1);

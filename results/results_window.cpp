@@ -5,6 +5,9 @@
 #include <QListWidget>
 #include <QPushButton>
 #include <QScreen>
+#include <QStyle>
+#include <QStyleFactory>
+#include <QTimer>
 
 #include "game/windows.h"
 #include "platform/layout.h"
@@ -66,6 +69,13 @@ void Colour(QPushButton* button, const QColor& background) {
     button->setPalette(palette);
 }
 
+// Not every desktop's style heeds a button's own colour; this one does.
+void UseFusion(QPushButton* button) {
+    QStyle* style = QStyleFactory::create("Fusion");
+    style->setParent(button);
+    button->setStyle(style);
+}
+
 }  // namespace
 
 Results::Results() {
@@ -77,6 +87,7 @@ Results::Results() {
     setTabOrders();
     makeBoard();
     makeSummary();
+    colourControls();
     SetDefaultButton(this, ResultsOK);
     ResultsOK->setFocus();
 }
@@ -99,8 +110,8 @@ void Results::makeButtons() {
     AddToDict = MakeButton(this, "AddToDict", "=>", Pixels(280, 328, 65, 41), ArrowFont());
     RemoveFromDict =
         MakeButton(this, "RemoveFromDict", "<=", Pixels(280, 376, 65, 41), ArrowFont());
-    Colour(AddToDict, QColor(128, 255, 128));
-    Colour(RemoveFromDict, QColor(255, 128, 128));
+    UseFusion(AddToDict);
+    UseFusion(RemoveFromDict);
     AddToDict->setAccessibleName("Add to dictionary");
     RemoveFromDict->setAccessibleName("Remove from dictionary");
     ResultsOK->setShortcut(Qt::ALT | Qt::Key_O);
@@ -128,12 +139,7 @@ void Results::makeBoard() {
             Condensed(CubeFont(), "Qu", CubeSide - 4));
         cube->setFrameStyle(QFrame::Box | QFrame::Plain);
         cube->setAutoFillBackground(true);
-        QPalette palette = cube->palette();
-        palette.setColor(QPalette::WindowText, Qt::black);
-        cube->setPalette(palette);
-        const auto index = static_cast<std::size_t>(k);
-        LightResultCube(*cube, index, false);
-        ResultCubes[index] = cube;
+        ResultCubes[static_cast<std::size_t>(k)] = cube;
     }
 }
 
@@ -143,6 +149,14 @@ void Results::makeSummary() {
     BadWordsLabel = MakeLabel(this, "BadWordsLabel", Pixels(160, 512, 457, 33), SummaryFont());
     for (QLabel* line : {WordsLabel, ScoreLabel, BadWordsLabel}) {
         line->setAlignment(Qt::AlignRight | Qt::AlignVCenter);
+    }
+}
+
+void Results::colourControls() {
+    Colour(AddToDict, QColor(128, 255, 128));
+    Colour(RemoveFromDict, QColor(255, 128, 128));
+    for (std::size_t k = 0; k < ResultCubes.size(); ++k) {
+        LightResultCube(*ResultCubes[k], k, ResultCubes[k]->property("selected").toBool());
     }
 }
 
@@ -170,4 +184,13 @@ void Results::closeEvent(QCloseEvent* event) {
     event->accept();
     WindowFront::Hide(*this);
     Windows::Discard<Results>();
+}
+
+// Some desktops give every control a new palette when their colours change, also
+// one that has colours of its own; these are given back when all is done.
+void Results::changeEvent(QEvent* event) {
+    QWidget::changeEvent(event);
+    if (event->type() == QEvent::PaletteChange) {
+        QTimer::singleShot(0, this, &Results::colourControls);
+    }
 }

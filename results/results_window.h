@@ -33,6 +33,7 @@ class Results : public QWidget {
 
   protected:
     void closeEvent(QCloseEvent* event) override;
+    void changeEvent(QEvent* event) override;
 
   private:
     void makeLists();
@@ -40,5 +41,6 @@ class Results : public QWidget {
     void setTabOrders();
     void makeBoard();
     void makeSummary();
+    void colourControls();
     bool placed_ = false;
 };

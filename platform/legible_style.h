@@ -1,0 +1,12 @@
+#pragma once
+#include <QProxyStyle>
+
+/// The desktop's style, its palette made legible: every text that is not disabled
+/// has a contrast of at least 4.5 to its background. Install it for the application.
+class LegibleStyle : public QProxyStyle {
+    Q_OBJECT
+
+  public:
+    void polish(QPalette& palette) override;
+    using QProxyStyle::polish;
+};
