@@ -15,6 +15,7 @@
 #include "game/main_window.h"
 #include "game/windows.h"
 #include "platform/layout.h"
+#include "platform/list_keys.h"
 #include "platform/menu_bar.h"
 
 namespace {
@@ -100,6 +101,8 @@ void DictionaryEditor::makeLists() {
     WordList->setEditTriggers(QListView::NoEditTriggers);
     WordList->setSelectionMode(QListView::SingleSelection);
     WordList->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    SelectByArrowKeys(WordList);
+    setTabOrder(WordList, Remove);
 }
 
 void DictionaryEditor::makeWordEntry() {

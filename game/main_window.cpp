@@ -86,7 +86,8 @@ void Main::makeToolBar() {
     Dictionary = makeToolButton("Dictionary", 2280, "Dictionary editor", Qt::Key_D);
     HelpButton = makeToolButton("HelpButton", 3120, "", Qt::Key_H);
     Exit = makeToolButton("Exit", 3960, "Exit game", Qt::Key_X);
-    HelpButton->setText("?");
+    HelpButton->setText("?");  // drops the shortcut
+    HelpButton->setShortcut(Qt::ALT | Qt::Key_H);
     HelpButton->setAccessibleName("Help");
     connect(Start, &QToolButton::clicked, this, [] { Common::StartGame(); });
     connect(Pause, &QToolButton::clicked, this, [] { Common::PauseGame(); });
@@ -170,6 +171,7 @@ void Main::makeWordList() {
     WordList->horizontalHeader()->hide();
     WordList->verticalHeader()->hide();
     WordList->setColumnCount(1);
+    WordList->setHorizontalHeaderLabels({"Word"});
     WordList->setEditTriggers(QTableWidget::NoEditTriggers);
     WordList->setSelectionMode(QTableWidget::SingleSelection);
     WordList->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);

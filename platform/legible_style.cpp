@@ -1,5 +1,7 @@
 #include "platform/legible_style.h"
 
+#include <QPainter>
+#include <QStyleOption>
 #include <algorithm>
 #include <array>
 #include <cmath>
@@ -57,5 +59,22 @@ void LegibleStyle::polish(QPalette& palette) {
             palette.setColor(group, textRole, clearText);
             palette.setColor(group, backgroundRole, MovedFrom(clearText, background, 1 - end));
         }
+    }
+}
+
+// Most styles show a list's focus on its current row, and an empty list has none;
+// and Fusion marks a menu bar's item only while its menu is open.
+void LegibleStyle::drawControl(ControlElement element, const QStyleOption* option,
+                               QPainter* painter, const QWidget* widget) const {
+    const auto* item = qstyleoption_cast<const QStyleOptionMenuItem*>(option);
+    if (element == CE_MenuBarItem && item != nullptr && item->state.testFlag(State_Selected)) {
+        QStyleOptionMenuItem marked(*item);
+        marked.state |= State_Sunken;
+        return QProxyStyle::drawControl(element, &marked, painter, widget);
+    }
+    QProxyStyle::drawControl(element, option, painter, widget);
+    if (element == CE_ShapedFrame && option->state.testFlag(State_HasFocus)) {
+        painter->setPen(option->palette.color(QPalette::Highlight));
+        painter->drawRect(option->rect.adjusted(0, 0, -1, -1));
     }
 }

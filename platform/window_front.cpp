@@ -56,6 +56,7 @@ void Bring(QWidget& window) {
     window.show();
     window.raise();
     window.activateWindow();
+    window.setAttribute(Qt::WA_KeyboardFocusChange);  // shows the focus before the first Tab
 }
 
 void Hide(QWidget& window) {

@@ -11,6 +11,7 @@
 
 #include "game/windows.h"
 #include "platform/layout.h"
+#include "platform/list_keys.h"
 #include "results/result_lists.h"
 #include "results/results_commands.h"
 
@@ -45,6 +46,7 @@ QListWidget* MakeList(Results* window, const char* name, const char* spokenName,
     list->setSortingEnabled(true);
     list->setUniformItemSizes(true);
     list->setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    SelectByArrowKeys(list);
     const auto showPath = [list] {
         const QString word = SelectedWord(*list);
         if (!word.isEmpty()) Common::ShowResultPath(word);

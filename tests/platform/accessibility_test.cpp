@@ -1,4 +1,5 @@
 // What a screen reader finds in the windows.
+#include <QAbstractButton>
 #include <QAccessible>
 #include <QLabel>
 #include <QMenuBar>
@@ -93,6 +94,22 @@ TEST_F(Accessibility, LabelsListsAndOptionsAreReadAsTheyStand) {
     press("Dictionary");
     EXPECT_EQ(description("StartingLetters"), "Starting letters");
     EXPECT_EQ(rows("DictionaryEditor/WordList"), Words{"bone"});
+}
+
+TEST_F(Accessibility, ToolbarButtonsHaveShortcuts) {
+    for (auto* button : control("ToolBar")->findChildren<QAbstractButton*>()) {
+        EXPECT_FALSE(button->shortcut().isEmpty()) << button->objectName().toStdString();
+    }
+}
+
+TEST_F(Accessibility, AnArrowKeySelectsTheOnlyWordOfAList) {
+    type("sta");
+    key(Qt::Key_Return);
+    press("End");
+    control("BadWords")->setFocus();
+    EXPECT_EQ(litResults(), Tiles{});
+    key(Qt::Key_Down);
+    EXPECT_EQ(litResults(), (Tiles{1, 2, 3}));
 }
 
 }  // namespace
