@@ -6,9 +6,10 @@
 
 namespace {
 
+// A check box, since readers say of no other control whether it is checked.
 class TileAccessible : public QAccessibleWidget {
   public:
-    explicit TileAccessible(CubeTile* tile) : QAccessibleWidget(tile, QAccessible::Button) {}
+    explicit TileAccessible(CubeTile* tile) : QAccessibleWidget(tile, QAccessible::CheckBox) {}
 
     QAccessible::State state() const override {
         QAccessible::State state = QAccessibleWidget::state();

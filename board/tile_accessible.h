@@ -1,5 +1,5 @@
 #pragma once
 
-/// Lets screen readers see a tile as a button that is checked while it is lit
-/// and that their users can press.
+/// Lets screen readers see a tile as a box that is checked while it is lit and
+/// that their users can press.
 void MakeTilesAccessible();

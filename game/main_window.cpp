@@ -25,6 +25,7 @@
 #include "options/options_commands.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
+#include "platform/window_accessible.h"
 
 namespace {
 
@@ -57,6 +58,7 @@ Main::Main() {
     setWindowFlags(Qt::Window | Qt::WindowTitleHint | Qt::WindowSystemMenuHint |
                    Qt::WindowMinimizeButtonHint | Qt::WindowCloseButtonHint);
     setFixedSize(Twips(ClientWidth), Twips(ClientHeight));
+    MakeWindowsAccessible();
     makeToolBar();
     makeBoard();
     makeWordEntry();
@@ -122,6 +124,7 @@ void Main::makeBoard() {
     MakeTilesAccessible();
     CubeFrame = new QFrame(this);
     SetUp(CubeFrame, "CubeFrame", {120, 480, 5775, 6015}, MainFont());
+    CubeFrame->setAccessibleName("Board");
     for (int k = 0; k < 16; ++k) {
         auto* tile = new CubeTile(CubeFrame);
         const QByteArray name = "Cube" + QByteArray::number(k);
