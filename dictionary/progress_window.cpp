@@ -14,7 +14,16 @@ namespace {
 constexpr int ClientWidth = 4200;
 constexpr int ClientHeight = 900;
 constexpr int StepInterval = 10;  // milliseconds
+constexpr TwipsRect BarPlace{120, 600, 3975, 135};
 const QColor BarColour(0, 0, 192);
+const QColor TrackColour(Qt::white);  // in a dark window the bar would not be seen
+
+void Fill(QLabel& label, const QColor& colour) {
+    QPalette colours = label.palette();
+    colours.setColor(QPalette::Window, colour);
+    label.setPalette(colours);
+    label.setAutoFillBackground(true);
+}
 
 }  // namespace
 
@@ -27,8 +36,8 @@ Progress::Progress() {
     setFrameStyle(QFrame::Box | QFrame::Plain);
     ProgressLabel = MakeLabel(this, "ProgressLabel", {480, 120, 3255, 375},
                               LayoutFont(Typeface::SansSerif, 13.5));
-    ProgressIndicator = MakeLabel(this, "ProgressIndicator", {120, 600, 3975, 135}, PlainFont());
-    ProgressIndicator->setAutoFillBackground(true);
+    track_ = MakeLabel(this, "ProgressTrack", BarPlace, PlainFont());
+    ProgressIndicator = MakeLabel(this, "ProgressIndicator", BarPlace, PlainFont());
     colourBar();
     DictionaryTimer = new QTimer(this);
     DictionaryTimer->setObjectName("DictionaryTimer");
@@ -48,9 +57,8 @@ void Progress::HideDisplay() {
 }
 
 void Progress::colourBar() {
-    QPalette colours = ProgressIndicator->palette();
-    colours.setColor(QPalette::Window, BarColour);
-    ProgressIndicator->setPalette(colours);
+    Fill(*track_, TrackColour);
+    Fill(*ProgressIndicator, BarColour);
 }
 
 // Some desktops give every control a new palette when their colours change.

@@ -24,4 +24,5 @@ class Progress : public QFrame {
 
   private:
     void colourBar();
+    QLabel* track_ = nullptr;  ///< as long as the whole bar
 };
