@@ -43,10 +43,19 @@ QColor MovedFrom(const QColor& other, const QColor& colour, double end) {
     return moved;
 }
 
+// Where a text goes, 1 for white: further from its background; selected text so
+// that selections, in whose colour the focus is drawn, stand out from the window.
+double TextEnd(const QPalette& palette, QPalette::ColorGroup group, QPalette::ColorRole text,
+               QPalette::ColorRole background) {
+    const bool selected = text == QPalette::HighlightedText;
+    const QColor dark = palette.color(group, selected ? QPalette::WindowText : background);
+    const QColor light = palette.color(group, selected ? QPalette::Window : text);
+    return Luminance(light) > Luminance(dark) ? 1 : 0;
+}
+
 }  // namespace
 
-// The text moves first: a window's background is best left as the desktop has it.
-// Selected text is mostly black or white already; there the background moves.
+// The text moves first: a background is best left as the desktop has it.
 void LegibleStyle::polish(QPalette& palette) {
     QProxyStyle::polish(palette);
     for (const auto group : {QPalette::Active, QPalette::Inactive}) {
@@ -54,7 +63,7 @@ void LegibleStyle::polish(QPalette& palette) {
             const QColor text = palette.color(group, textRole);
             const QColor background = palette.color(group, backgroundRole);
             if (Contrast(text, background) >= Legible) continue;
-            const double end = Luminance(text) > Luminance(background) ? 1 : 0;
+            const double end = TextEnd(palette, group, textRole, backgroundRole);
             const QColor clearText = MovedFrom(background, text, end);
             palette.setColor(group, textRole, clearText);
             palette.setColor(group, backgroundRole, MovedFrom(clearText, background, 1 - end));

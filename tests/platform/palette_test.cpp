@@ -29,6 +29,10 @@ TEST_F(Palettes, TextsAreMovedFromTheirBackgroundNoFurtherThanNeeded) {
     palette.setColor(QPalette::Highlight, QColor(140, 140, 140));
     EXPECT_LE(Polished(QPalette::Highlight, palette).red(), 118);
     EXPECT_EQ(Polished(QPalette::HighlightedText, palette), QColor(Qt::white));
+    palette.setColor(QPalette::Window, Qt::black);
+    palette.setColor(QPalette::WindowText, Qt::white);
+    EXPECT_EQ(Polished(QPalette::Highlight, palette), QColor(140, 140, 140));
+    EXPECT_LE(Polished(QPalette::HighlightedText, palette).red(), 26);
 }
 
 TEST_F(Palettes, ADesktopThatTurnsDarkChangesTilesAndPicturesButNoColourOfOurs) {
