@@ -3,6 +3,7 @@
 #include <QAccessible>
 #include <QLabel>
 #include <QMenuBar>
+#include <QTest>
 #include <set>
 
 #include "support/program_fixture.h"
@@ -98,10 +99,16 @@ TEST_F(Accessibility, LabelsListsAndOptionsAreReadAsTheyStand) {
     EXPECT_EQ(rows("DictionaryEditor/WordList"), Words{"bone"});
 }
 
-TEST_F(Accessibility, ToolbarButtonsHaveShortcuts) {
+TEST_F(Accessibility, ToolbarButtonsHaveShortcutsAndArePressedWithoutWaiting) {
     for (auto* button : control("ToolBar")->findChildren<QAbstractButton*>()) {
         EXPECT_FALSE(button->shortcut().isEmpty()) << button->objectName().toStdString();
     }
+    bool shown = false;
+    boxes_.expect("Game paused", "Hit OK when ready to resume.", QMessageBox::Ok, QMessageBox::Ok,
+                  [&shown] { shown = true; });
+    told(control("Pause")).actionInterface()->doAction(QAccessibleActionInterface::pressAction());
+    EXPECT_FALSE(shown);  // a reader that waited could not read the box
+    EXPECT_TRUE(QTest::qWaitFor([&shown] { return shown; }));
 }
 
 TEST_F(Accessibility, AnArrowKeySelectsTheOnlyWordOfAList) {
