@@ -11,46 +11,56 @@
 // the inner loop runs long. When there are very many, they are taken in blocks, and each block's
 // longer chains first: so memory is bounded whatever the board.
 //
-// A chain carries the index of the first word below its node. A word found is marked by its index:
-// one found along many chains is marked once, and the marks are in alphabetical order.
+// A chain carries the index of the first word below its node. A word found is marked by its index,
+// so that one found along many chains counts once.
+//
+// The inner loop has no branch that depends on what the board shows: chains and words are written
+// first and counted after, and conditions are worked out as numbers, 0 or 1. They are numbers by
+// the sign of a difference, because the processor's way from a comparison to a number (a byte of
+// a register is set, and the rest of it waited for) makes one chain wait for another.
 
 namespace {
 
 constexpr std::size_t Block = 512;        // chains extended together
 constexpr std::size_t HardAfter = 16384;  // chains extended, before they are looked at twice
 constexpr std::size_t MostTouching = 8;   // cubes around a cube
-constexpr std::uint8_t NoCube = Cubes;    // where the empty chain ends; every cube touches it
-constexpr std::uint32_t QBit = 1U << ('q' - 'a');
-constexpr std::uint32_t UBit = 1U << ('u' - 'a');
+constexpr std::uint32_t QBit = 1U << LetterQ;
+constexpr std::uint32_t UBit = 1U << LetterU;
 
-/// Cubes joined to a beginning of words. Same cubes in another order are another chain only if the
-/// letters differ or the last cube does.
+/// Cubes joined to a beginning of words that can go on. Same cubes in another order are another
+/// chain only if the letters differ or the last cube does.
 struct Chain {
+    std::uint64_t path;  // the cubes, as of a FoundWord
     NodeIndex node;
     std::uint32_t firstWord;  // index of the first word below the node
     std::uint16_t used;       // bit i: cube i is in the chain
-    std::uint8_t cube;        // the last one
-    std::uint8_t letters;
+    std::uint16_t next;       // bit i: the chain can go on with cube i
+    std::uint32_t letters;
 };
 
-constexpr std::array<std::uint16_t, Cubes + 1> MakeTouching() {
-    std::array<std::uint16_t, Cubes + 1> touching{};
+constexpr std::array<std::uint32_t, Cubes> MakeTouching() {
+    std::array<std::uint32_t, Cubes> touching{};
     for (int a = 0; a < Cubes; ++a) {
         for (int b = 0; b < Cubes; ++b) {
             const int rows = a / 4 - b / 4;
             const int columns = a % 4 - b % 4;
             const bool near = rows * rows <= 1 && columns * columns <= 1 && a != b;
-            if (near) touching[a] = static_cast<std::uint16_t>(touching[a] | (1 << b));
+            if (near) touching[a] |= 1U << b;
         }
     }
-    touching[NoCube] = 0xffff;
     return touching;
 }
 
 constexpr auto Touching = MakeTouching();
 
+/// 1 when a < b, else 0. Both are below 2^31.
+constexpr std::uint32_t IsLess(std::uint32_t a, std::uint32_t b) {
+    return (a - b) >> 31;
+}
+
 /// On the way along a cube's letters.
 struct Step {
+    std::uint64_t path;
     NodeIndex node;
     std::uint32_t firstWord;
     std::uint32_t letters;
@@ -59,13 +69,7 @@ struct Step {
 /// Where the next chain and the next word found go.
 struct Output {
     Chain* chains;
-    std::uint32_t* words;
-};
-
-/// A chain and the cubes that it can still go on with.
-struct Growing {
-    const Chain* chain;
-    std::uint32_t cubesLeft;
+    FoundWord* words;
 };
 
 /// Chains of as many cubes as the level's number, one behind the other.
@@ -84,109 +88,30 @@ struct BoardSearch::State {
     CubeBits cubes;
     RankSet found;
     RecentChains recent;  // once a board is hard
-    std::vector<std::uint32_t> ranks;
+    std::vector<FoundWord>* out;
     const std::uint32_t* nodes;
     std::uint32_t minLetters;
     std::uint32_t maxLetters;
 
     // Words found by the block being extended.
-    std::array<std::uint32_t, 2 * Block * MostTouching + 1> words;
-
-    std::array<Growing, Block + 1> growing;
+    std::array<FoundWord, 2 * Block * MostTouching + 1> words;
 
     template <class Match>
-    std::size_t matchBlock(const Match& match, const Chain* chain, const Chain* end);
-    void growBlock(std::size_t count, Output& out);
-    void grow(const Chain& chain, std::uint32_t cube, Output& out) const;
-    void take(Step& step, std::uint32_t bit, Output& out) const;
+    void run(NodeIndex root);
     template <class Match>
     Chain* extendBlock(const Match& match, const Chain* chain, const Chain* end, Chain* to);
     template <class Match>
-    void run();
+    void extend(const Match& match, const Chain& chain, std::uint32_t cube, Output& output) const;
+    void take(Step& step, std::uint32_t bit, std::uint32_t endsInQ, Output& output) const;
+    void keepNew(const FoundWord* end);
     Chain* thinOut(Chain* begin, Chain* end);
 };
 
-// Finds the cubes that each chain of the block can go on with, and gathers the chains that have
-// any. Returns the number of such cubes, all chains together.
 template <class Match>
-inline std::size_t BoardSearch::State::matchBlock(const Match& match, const Chain* chain,
-                                                  const Chain* end) {
-    std::size_t count = 0;
-    Growing* last = growing.data();
-    for (; chain != end; ++chain) {
-        const std::uint32_t cubesLeft =
-            match(nodes[chain->node]) & Touching[chain->cube] & ~std::uint32_t{chain->used};
-        *last = {chain, cubesLeft};
-        last += cubesLeft != 0 ? 1 : 0;
-        count += EdgeCount(cubesLeft);
-    }
-    return count;
-}
-
-// Makes the longer chains of those gathered. No branch depends on what the board shows: chains and
-// words are written first and counted after, and going on to the next chain is a choice of values.
-inline void BoardSearch::State::growBlock(std::size_t count, Output& out) {
-    const Growing* from = growing.data();
-    std::uint32_t cubesLeft = from->cubesLeft;
-    for (; count > 0; --count) {
-        grow(*from->chain, static_cast<std::uint32_t>(std::countr_zero(cubesLeft)), out);
-        cubesLeft &= cubesLeft - 1;
-        const std::uint32_t done = cubesLeft == 0 ? 1 : 0;
-        from += done;
-        cubesLeft |= from->cubesLeft & (0 - done);
-    }
-}
-
-inline void BoardSearch::State::grow(const Chain& chain, std::uint32_t cube, Output& out) const {
-    const std::uint32_t bit = cubes[cube];
-    Step step{chain.node, chain.firstWord, chain.letters};
-    take(step, bit, out);
-    if (bit == QBit) {
-        // Past a Qu cube a word goes on with its "u" or not at all.
-        if ((nodes[step.node] & UBit) == 0) return;
-        take(step, UBit, out);
-    }
-    __builtin_prefetch(nodes + step.node);
-    *out.chains = {step.node, step.firstWord, static_cast<std::uint16_t>(chain.used | (1U << cube)),
-                   static_cast<std::uint8_t>(cube), static_cast<std::uint8_t>(step.letters)};
-    out.chains += (step.node != NoNode ? 1U : 0U) & (step.letters < maxLetters ? 1U : 0U);
-}
-
-// Goes along the letter, which the node has.
-inline void BoardSearch::State::take(Step& step, std::uint32_t bit, Output& out) const {
-    const std::uint32_t* node = nodes + step.node;
-    const std::uint32_t* link = node + LinkOffset(node[0], bit);
-    const std::uint32_t isWord = link[0] >> 31;
-    ++step.letters;
-    step.firstWord += link[1];
-    *out.words = step.firstWord;
-    out.words += isWord & (step.letters - minLetters <= maxLetters - minLetters ? 1U : 0U);
-    step.firstWord += isWord;
-    step.node = ChildOf(link[0]);
-}
-
-// Drops the chains that need not be extended, and returns the new end.
-[[gnu::noinline]] Chain* BoardSearch::State::thinOut(Chain* begin, Chain* end) {
-    Exhaustion exhaustion(nodes, found, minLetters, maxLetters);
-    return std::remove_if(begin, end, [&](const Chain& chain) {
-        return exhaustion.holds(chain.node, chain.firstWord, chain.letters) ||
-               !recent.add(chain.firstWord, chain.letters, chain.used, chain.cube);
-    });
-}
-
-// Writes the longer chains to `to` and returns their end.
-template <class Match>
-inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* chain,
-                                              const Chain* end, Chain* to) {
-    Output out{to, words.data()};
-    growBlock(matchBlock(match, chain, end), out);
-    for (const std::uint32_t* word = words.data(); word != out.words; ++word) found.insert(*word);
-    return out.chains;
-}
-
-template <class Match>
-inline void BoardSearch::State::run() {
+inline void BoardSearch::State::run(NodeIndex root) {
     const Match match(cubes);
+    chains[0] = {0, root, 0, 0, static_cast<std::uint16_t>(match(nodes[root])), 0};
+    levels[0] = {chains.data(), chains.data() + 1};
     std::size_t extended = 0;
     bool isHard = false;
     for (Level* level = levels.data();;) {
@@ -208,16 +133,97 @@ inline void BoardSearch::State::run() {
     }
 }
 
+// Writes the longer chains to `to` and returns their end.
+template <class Match>
+inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* chain,
+                                              const Chain* end, Chain* to) {
+    std::uint32_t count = 0;
+    for (const Chain* each = chain; each != end; ++each) count += EdgeCount(each->next);
+    Output output{to, words.data()};
+    std::uint32_t next = chain->next;
+    for (; count > 0; --count) {
+        extend(match, *chain, static_cast<std::uint32_t>(std::countr_zero(next)), output);
+        next &= next - 1;
+        const std::uint32_t isDone = IsLess(next, 1);
+        next |= chain[1].next & (0 - isDone);
+        chain += isDone;
+    }
+    keepNew(output.words);
+    return output.chains;
+}
+
+template <class Match>
+inline void BoardSearch::State::extend(const Match& match, const Chain& chain, std::uint32_t cube,
+                                       Output& output) const {
+    const std::uint32_t bit = cubes[cube];
+    Step step{chain.path << 4 | cube, chain.node, chain.firstWord, chain.letters};
+    if (bit != QBit) [[likely]] {
+        take(step, bit, 0, output);
+    } else {
+        // Past a Qu cube a word goes on with its "u" or not at all.
+        take(step, QBit, 1, output);
+        if ((nodes[step.node] & UBit) == 0 || step.letters == maxLetters) return;
+        take(step, UBit, 0, output);
+    }
+    const std::uint32_t used = chain.used | (1U << cube);
+    const std::uint32_t mayGoOn = 0 - IsLess(step.letters, maxLetters);
+    const std::uint32_t next = match(nodes[step.node]) & Touching[cube] & ~used & mayGoOn;
+    *output.chains = {step.path,
+                      step.node,
+                      step.firstWord,
+                      static_cast<std::uint16_t>(used),
+                      static_cast<std::uint16_t>(next),
+                      step.letters};
+    output.chains += IsLess(0, next);
+}
+
+// Goes along the letter, which the node has.
+inline void BoardSearch::State::take(Step& step, std::uint32_t bit, std::uint32_t endsInQ,
+                                     Output& output) const {
+    const std::uint32_t* node = nodes + step.node;
+    const std::uint32_t* link = node + LinkOffset(node[0], bit);
+    const std::uint32_t isWord = link[0] >> 31;
+    ++step.letters;
+    step.firstWord += link[1];
+    *output.words = {step.path, step.firstWord, static_cast<std::uint16_t>(step.letters),
+                     static_cast<std::uint16_t>(endsInQ)};
+    output.words += isWord & ~IsLess(step.letters, minLetters);
+    step.firstWord += isWord;
+    step.node = ChildOf(link[0]);
+}
+
+// Of the block's words, those that are found for the first time.
+inline void BoardSearch::State::keepNew(const FoundWord* end) {
+    std::size_t count = out->size();
+    out->resize(count + static_cast<std::size_t>(end - words.data()));
+    FoundWord* const kept = out->data();
+    for (const FoundWord* word = words.data(); word != end; ++word) {
+        kept[count] = *word;
+        count += found.insert(word->index);
+    }
+    out->resize(count);
+}
+
+// Drops the chains that need not be extended, and returns the new end.
+[[gnu::noinline]] Chain* BoardSearch::State::thinOut(Chain* begin, Chain* end) {
+    Exhaustion exhaustion(nodes, found, minLetters, maxLetters);
+    return std::remove_if(begin, end, [&](const Chain& chain) {
+        return exhaustion.holds(chain.node, chain.firstWord, chain.letters) ||
+               !recent.add(chain.firstWord, chain.letters, chain.used, chain.path % Cubes);
+    });
+}
+
 namespace {
 
 #if defined(__x86_64__)
 template <class State>
-[[gnu::target("avx2,bmi,popcnt"), gnu::flatten]] void RunAvx2(State& state) {
-    state.template run<Avx2Match>();
+[[gnu::target("avx2,bmi,popcnt"), gnu::flatten]] void RunAvx2(State& state, NodeIndex root) {
+    state.template run<Avx2Match>(root);
 }
 template <class State>
-[[gnu::target("avx512f,avx2,bmi,popcnt"), gnu::flatten]] void RunAvx512(State& state) {
-    state.template run<Avx512Match>();
+[[gnu::target("avx512f,avx2,bmi,popcnt"), gnu::flatten]] void RunAvx512(State& state,
+                                                                        NodeIndex root) {
+    state.template run<Avx512Match>(root);
 }
 #endif
 
@@ -242,29 +248,28 @@ BoardSearch::BoardSearch(Matching matching) : matching_(matching), state_(new St
 
 BoardSearch::~BoardSearch() = default;
 
-const std::vector<std::uint32_t>& BoardSearch::search(const WordGraph& graph, const Board& board,
-                                                      SearchLimits limits) {
+void BoardSearch::search(const WordGraph& graph, const Board& board, SearchLimits limits,
+                         std::vector<FoundWord>& found) {
+    found.clear();
+    if (limits.minLetters > limits.maxLetters) return;
     State& state = *state_;
     for (std::size_t i = 0; i < board.size(); ++i) state.cubes[i] = 1U << board[i];
     state.found.resize(graph.size());
+    state.out = &found;
     state.nodes = graph.nodes();
     state.minLetters = static_cast<std::uint32_t>(limits.minLetters);
     state.maxLetters = static_cast<std::uint32_t>(limits.maxLetters);
-    state.chains[0] = {graph.root(), 0, 0, NoCube, 0};
-    const bool canFind = limits.minLetters <= limits.maxLetters;
-    state.levels[0] = {state.chains.data(), state.chains.data() + (canFind ? 1 : 0)};
     switch (matching_) {
 #if defined(__x86_64__)
         case Matching::Avx512:
-            RunAvx512(state);
+            RunAvx512(state, graph.root());
             break;
         case Matching::Avx2:
-            RunAvx2(state);
+            RunAvx2(state, graph.root());
             break;
 #endif
         default:
-            state.run<PlainMatch>();
+            state.run<PlainMatch>(graph.root());
     }
-    state.found.drainTo(state.ranks);
-    return state.ranks;
+    for (const FoundWord& word : found) state.found.clearAround(word.index);
 }

@@ -1,19 +1,14 @@
 #pragma once
-// Finding every word of a graph on a board of 4 by 4 touching cubes.
-#include <array>
+// Finding every word of a graph on a board of touching cubes.
 #include <cstdint>
 #include <memory>
-#include <string_view>
 #include <vector>
 
+#include "board.h"
+#include "found_words.h"
 #include "word_graph.h"
 
-inline constexpr int Cubes = 16;
-
-/// The letters 0..25 of the cubes, row by row; "q" stands for the Qu cube.
-using Board = std::array<std::uint8_t, Cubes>;
-
-/// How the letters below a node are compared with those around a cube; all find the same.
+/// How the letters below a node are compared with those of the cubes; all find the same.
 enum class Matching { Plain, Avx2, Avx512 };
 
 /// Whether this machine can do it, and the best that it can.
@@ -33,9 +28,10 @@ class BoardSearch {
     BoardSearch(const BoardSearch&) = delete;
     BoardSearch& operator=(const BoardSearch&) = delete;
 
-    /// The indexes of the words found, ascending, each once; valid until the next search.
-    const std::vector<std::uint32_t>& search(const WordGraph& graph, const Board& board,
-                                             SearchLimits limits);
+    /// Replaces `found` by the words found, each once, in no order. Throws std::bad_alloc; then
+    /// the BoardSearch is of no more use.
+    void search(const WordGraph& graph, const Board& board, SearchLimits limits,
+                std::vector<FoundWord>& found);
 
   private:
     struct State;

@@ -1,47 +1,43 @@
 #pragma once
-// A set of word indexes that is read in ascending order and empties itself by that.
-#include <bit>
+// A set of word indexes: a bit for each word of the dictionary.
 #include <cstddef>
 #include <cstdint>
-#include <vector>
+#include <cstdlib>
+#include <memory>
+#include <new>
 
-/// Two levels of bits: one for each index, and one for each 64 of them, so that reading a few
-/// indexes out of many does not look at them all.
 class RankSet {
   public:
     /// Makes room for indexes below `count`. The set must be empty.
     void resize(std::size_t count) {
-        ranks_.resize((count >> 6) + 1);
-        groups_.resize((count >> 12) + 1);
+        if (count <= count_) return;
+        // Memory that the system hands out zeroed, page by page as it is used: a small file can
+        // spell a huge number of words.
+        words_.reset(
+            static_cast<std::uint64_t*>(std::calloc((count >> 6) + 1, sizeof *words_.get())));
+        count_ = words_ ? count : 0;
+        if (!words_) throw std::bad_alloc();
     }
 
-    void insert(std::uint32_t rank) {
-        ranks_[rank >> 6] |= std::uint64_t{1} << (rank & 63);
-        groups_[rank >> 12] |= std::uint64_t{1} << ((rank >> 6) & 63);
+    /// 1 when the index was not held, else 0: to count by, without a branch.
+    std::uint32_t insert(std::uint32_t index) {
+        std::uint64_t& word = words_[index >> 6];
+        const std::uint64_t before = word;
+        word |= std::uint64_t{1} << (index & 63);
+        return (~before >> (index & 63)) & 1;
     }
 
-    bool contains(std::uint32_t rank) const {
-        return ((ranks_[rank >> 6] >> (rank & 63)) & 1) != 0;
+    bool contains(std::uint32_t index) const {
+        return ((words_[index >> 6] >> (index & 63)) & 1) != 0;
     }
 
-    /// Moves all indexes to `out`, which they replace.
-    void drainTo(std::vector<std::uint32_t>& out) {
-        out.clear();
-        for (std::size_t i = 0; i < groups_.size(); ++i) {
-            for (; groups_[i] != 0; groups_[i] &= groups_[i] - 1) {
-                drainGroup((i << 6) + static_cast<std::size_t>(std::countr_zero(groups_[i])), out);
-            }
-        }
-    }
+    /// Also forgets others near it: for emptying the set of all it holds.
+    void clearAround(std::uint32_t index) { words_[index >> 6] = 0; }
 
   private:
-    void drainGroup(std::size_t group, std::vector<std::uint32_t>& out) {
-        for (; ranks_[group] != 0; ranks_[group] &= ranks_[group] - 1) {
-            out.push_back(static_cast<std::uint32_t>(
-                (group << 6) + static_cast<std::size_t>(std::countr_zero(ranks_[group]))));
-        }
-    }
-
-    std::vector<std::uint64_t> ranks_;
-    std::vector<std::uint64_t> groups_;
+    struct Free {
+        void operator()(std::uint64_t* words) const { std::free(words); }
+    };
+    std::unique_ptr<std::uint64_t[], Free> words_;
+    std::size_t count_ = 0;
 };

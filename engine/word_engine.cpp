@@ -15,7 +15,6 @@
 #include "word_cursor.h"
 #include "word_file_export.h"
 #include "word_file_merge.h"
-#include "word_reader.h"
 
 // The flat interface: checks what callers pass, and lets no exception out.
 
@@ -25,8 +24,10 @@ WordCursor Listing;
 
 struct LastSearch {
     std::unique_ptr<BoardSearch> search;  // made by the first search
-    WordReader reader;
-    std::vector<std::uint32_t> found;
+    Board board{};
+    std::vector<FoundWord> words;
+    bool isSorted = false;
+    std::vector<FoundWord> room;  // for sorting
 };
 
 LastSearch Found;
@@ -93,16 +94,22 @@ WordGraph ReducedTo(const WordGraph& words, std::size_t longest) {
 
 /// Words found on a board that is 16 letters.
 void SearchBoard(std::string_view letters) {
-    Board board{};
-    for (std::size_t i = 0; i < board.size(); ++i) {
-        board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
+    for (std::size_t i = 0; i < Found.board.size(); ++i) {
+        Found.board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
     }
+    Found.isSorted = false;
     // Out of memory, a search is left in its midst, and must not be used again.
     auto search = Found.search ? std::move(Found.search) : std::make_unique<BoardSearch>();
-    Found.found = search->search(TheDictionary.words, board,
-                                 {TheDictionary.minWordSize, TheDictionary.maxWordSize});
-    Found.reader = WordReader(TheDictionary.words);
+    search->search(TheDictionary.words, Found.board,
+                   {TheDictionary.minWordSize, TheDictionary.maxWordSize}, Found.words);
     Found.search = std::move(search);
+}
+
+/// Word i, of those there are, in alphabetical order; returns the number of its letters.
+std::size_t SpellFound(std::size_t i, char* letters) {
+    if (!Found.isSorted) SortFound(Found.words, Found.room);
+    Found.isSorted = true;
+    return Spell(Found.words[i], Found.board, letters);
 }
 
 }  // namespace
@@ -190,24 +197,26 @@ int32_t cWriteTextFile(const char* path) {
 }
 
 int32_t cCheckForAllDefinedWords(const char* board) {
-    Found.found.clear();
-    return Guarded(0, [&] {
+    Found.words.clear();
+    const std::int32_t count = Guarded(-1, [&] {
         if (board == nullptr || Beginning(board).size() != Cubes || !IsLetters(Beginning(board))) {
             return 0;
         }
         SearchBoard(Beginning(board));
-        return static_cast<int32_t>(Found.found.size());
+        return static_cast<int32_t>(Found.words.size());
     });
+    if (count < 0) Found.words.clear();
+    return std::max(count, 0);
 }
 
 int32_t cGetDefinedWord(int32_t i, char* buffer, int32_t* n) {
     if (n == nullptr) return 0;
     *n = 0;
-    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= Found.found.size()) return 0;
-    const std::string_view word = Found.reader.word(Found.found[static_cast<std::size_t>(i)]);
-    std::copy(word.begin(), word.end(), buffer);
-    *n = static_cast<int32_t>(word.size());
-    return 1;
+    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= Found.words.size()) return 0;
+    return Guarded(0, [&] {
+        *n = static_cast<int32_t>(SpellFound(static_cast<std::size_t>(i), buffer));
+        return 1;
+    });
 }
 
 int32_t cMinWordSize(void) {

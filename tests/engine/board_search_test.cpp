@@ -5,7 +5,6 @@
 #include "board_search.h"
 #include "graph_builder.h"
 #include "random_words.h"
-#include "word_reader.h"
 
 namespace {
 
@@ -53,10 +52,16 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
     Words found(const WordGraph& graph, const std::string& letters, SearchLimits limits) {
         Board board{};
         for (std::size_t i = 0; i < 16; ++i) board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
-        WordReader reader(graph);
+        std::vector<FoundWord> found;
+        std::vector<FoundWord> room;
+        search_->search(graph, board, limits, found);
+        SortFound(found, room);
         Words words;
-        for (const std::uint32_t index : search_->search(graph, board, limits)) {
-            words.emplace_hint(words.end(), reader.word(index));
+        for (const FoundWord& each : found) {
+            std::array<char, 16> word{};
+            const std::string spelled(word.data(), Spell(each, board, word.data()));
+            EXPECT_TRUE(words.empty() || *words.rbegin() < spelled) << spelled;
+            words.insert(spelled);
         }
         return words;
     }

@@ -1,0 +1,22 @@
+#pragma once
+// The words that a search finds. What costs time is put off until the words are asked for: their
+// order, and their letters.
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+#include "board.h"
+
+/// A word as a chain of cubes.
+struct FoundWord {
+    std::uint64_t path;   // its cubes, four bits each, the last one lowest
+    std::uint32_t index;  // among the dictionary's words, in alphabetical order
+    std::uint16_t letters;
+    std::uint16_t endsInQ;  // 1: the last cube, a Qu, is the "q" alone
+};
+
+/// Puts words in the order of their indexes. `room`: memory to use again, whatever it holds.
+void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room);
+
+/// Writes the word's letters, at most 16, and returns how many.
+std::size_t Spell(const FoundWord& word, const Board& board, char* letters);
