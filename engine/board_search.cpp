@@ -24,8 +24,8 @@ namespace {
 constexpr std::size_t Block = 512;        // chains extended together
 constexpr std::size_t HardAfter = 16384;  // chains extended, before they are looked at twice
 constexpr std::size_t MostTouching = 8;   // cubes around a cube
-constexpr std::uint32_t QBit = 1U << LetterQ;
-constexpr std::uint32_t UBit = 1U << LetterU;
+constexpr std::uint32_t QBit = 1U << ('q' - 'a');
+constexpr std::uint32_t UBit = 1U << ('u' - 'a');
 
 /// Cubes joined to a beginning of words that can go on. Same cubes in another order are another
 /// chain only if the letters differ or the last cube does.
@@ -97,17 +97,31 @@ struct BoardSearch::State {
     std::array<FoundWord, 2 * Block * MostTouching + 1> words;
 
     template <class Match>
+    void runAny(NodeIndex root);
+    template <class Match, bool HasQu>
     void run(NodeIndex root);
-    template <class Match>
-    Chain* extendBlock(const Match& match, const Chain* chain, const Chain* end, Chain* to);
-    template <class Match>
-    void extend(const Match& match, const Chain& chain, std::uint32_t cube, Output& output) const;
+    template <class Match, bool HasQu>
+    Chain* extendBlock(const Match& match, const Chain* chain, const Chain* end, Chain* to,
+                       std::uint32_t cubesUsed);
+    template <class Match, bool HasQu>
+    void extend(const Match& match, const Chain& chain, std::uint32_t cube, Step step,
+                Output& output) const;
     void take(Step& step, std::uint32_t bit, std::uint32_t endsInQ, Output& output) const;
     void keepNew(const FoundWord* end);
     Chain* thinOut(Chain* begin, Chain* end);
 };
 
+// Only on boards with a Qu cube can chains of as many cubes have different numbers of letters.
 template <class Match>
+inline void BoardSearch::State::runAny(NodeIndex root) {
+    if (std::find(cubes.begin(), cubes.end(), QBit) != cubes.end()) {
+        run<Match, true>(root);
+    } else {
+        run<Match, false>(root);
+    }
+}
+
+template <class Match, bool HasQu>
 inline void BoardSearch::State::run(NodeIndex root) {
     const Match match(cubes);
     chains[0] = {0, root, 0, 0, static_cast<std::uint16_t>(match(nodes[root])), 0};
@@ -123,7 +137,9 @@ inline void BoardSearch::State::run(NodeIndex root) {
         Chain* const levelEnd = level->end;
         level->end -= std::min(levelEnd - level->begin, std::ptrdiff_t{Block});
         Chain* const end = isHard ? thinOut(level->end, levelEnd) : levelEnd;
-        Chain* const longer = extendBlock(match, level->end, end, levelEnd);
+        const auto cubesUsed = static_cast<std::uint32_t>(level - levels.data());
+        Chain* const longer =
+            extendBlock<Match, HasQu>(match, level->end, end, levelEnd, cubesUsed);
         extended += static_cast<std::size_t>(end - level->end);
         if (!isHard && extended >= HardAfter) {
             isHard = true;
@@ -134,15 +150,19 @@ inline void BoardSearch::State::run(NodeIndex root) {
 }
 
 // Writes the longer chains to `to` and returns their end.
-template <class Match>
+template <class Match, bool HasQu>
 inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* chain,
-                                              const Chain* end, Chain* to) {
+                                              const Chain* end, Chain* to,
+                                              std::uint32_t cubesUsed) {
     std::uint32_t count = 0;
     for (const Chain* each = chain; each != end; ++each) count += EdgeCount(each->next);
     Output output{to, words.data()};
     std::uint32_t next = chain->next;
     for (; count > 0; --count) {
-        extend(match, *chain, static_cast<std::uint32_t>(std::countr_zero(next)), output);
+        const auto cube = static_cast<std::uint32_t>(std::countr_zero(next));
+        const Step step{chain->path << 4 | cube, chain->node, chain->firstWord,
+                        HasQu ? chain->letters : cubesUsed};
+        extend<Match, HasQu>(match, *chain, cube, step, output);
         next &= next - 1;
         const std::uint32_t isDone = IsLess(next, 1);
         next |= chain[1].next & (0 - isDone);
@@ -152,28 +172,28 @@ inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* c
     return output.chains;
 }
 
-template <class Match>
+template <class Match, bool HasQu>
 inline void BoardSearch::State::extend(const Match& match, const Chain& chain, std::uint32_t cube,
-                                       Output& output) const {
+                                       Step step, Output& output) const {
     const std::uint32_t bit = cubes[cube];
-    Step step{chain.path << 4 | cube, chain.node, chain.firstWord, chain.letters};
-    if (bit != QBit) [[likely]] {
+    if (!HasQu || bit != QBit) {
         take(step, bit, 0, output);
     } else {
         // Past a Qu cube a word goes on with its "u" or not at all.
-        take(step, QBit, 1, output);
+        take(step, QBit, EndsInQ, output);
         if ((nodes[step.node] & UBit) == 0 || step.letters == maxLetters) return;
         take(step, UBit, 0, output);
     }
     const std::uint32_t used = chain.used | (1U << cube);
     const std::uint32_t mayGoOn = 0 - IsLess(step.letters, maxLetters);
     const std::uint32_t next = match(nodes[step.node]) & Touching[cube] & ~used & mayGoOn;
-    *output.chains = {step.path,
-                      step.node,
-                      step.firstWord,
-                      static_cast<std::uint16_t>(used),
-                      static_cast<std::uint16_t>(next),
-                      step.letters};
+    Chain& longer = *output.chains;
+    longer.path = step.path;
+    longer.node = step.node;
+    longer.firstWord = step.firstWord;
+    longer.used = static_cast<std::uint16_t>(used);
+    longer.next = static_cast<std::uint16_t>(next);
+    longer.letters = step.letters;
     output.chains += IsLess(0, next);
 }
 
@@ -185,8 +205,7 @@ inline void BoardSearch::State::take(Step& step, std::uint32_t bit, std::uint32_
     const std::uint32_t isWord = link[0] >> 31;
     ++step.letters;
     step.firstWord += link[1];
-    *output.words = {step.path, step.firstWord, static_cast<std::uint16_t>(step.letters),
-                     static_cast<std::uint16_t>(endsInQ)};
+    *output.words = {step.path, step.firstWord, step.letters | endsInQ};
     output.words += isWord & ~IsLess(step.letters, minLetters);
     step.firstWord += isWord;
     step.node = ChildOf(link[0]);
@@ -218,12 +237,12 @@ namespace {
 #if defined(__x86_64__)
 template <class State>
 [[gnu::target("avx2,bmi,popcnt"), gnu::flatten]] void RunAvx2(State& state, NodeIndex root) {
-    state.template run<Avx2Match>(root);
+    state.template runAny<Avx2Match>(root);
 }
 template <class State>
 [[gnu::target("avx512f,avx2,bmi,popcnt"), gnu::flatten]] void RunAvx512(State& state,
                                                                         NodeIndex root) {
-    state.template run<Avx512Match>(root);
+    state.template runAny<Avx512Match>(root);
 }
 #endif
 
@@ -253,7 +272,7 @@ void BoardSearch::search(const WordGraph& graph, const Board& board, SearchLimit
     found.clear();
     if (limits.minLetters > limits.maxLetters) return;
     State& state = *state_;
-    for (std::size_t i = 0; i < board.size(); ++i) state.cubes[i] = 1U << board[i];
+    for (std::size_t i = 0; i < board.size(); ++i) state.cubes[i] = LetterBit(board[i]);
     state.found.resize(graph.size());
     state.out = &found;
     state.nodes = graph.nodes();
@@ -269,7 +288,7 @@ void BoardSearch::search(const WordGraph& graph, const Board& board, SearchLimit
             break;
 #endif
         default:
-            state.run<PlainMatch>(graph.root());
+            state.runAny<PlainMatch>(graph.root());
     }
     for (const FoundWord& word : found) state.found.clearAround(word.index);
 }

@@ -9,11 +9,13 @@
 
 /// A word as a chain of cubes.
 struct FoundWord {
-    std::uint64_t path;   // its cubes, four bits each, the last one lowest
-    std::uint32_t index;  // among the dictionary's words, in alphabetical order
-    std::uint16_t letters;
-    std::uint16_t endsInQ;  // 1: the last cube, a Qu, is the "q" alone
+    std::uint64_t path;      // its cubes, four bits each, the last one lowest
+    std::uint32_t index;     // among the dictionary's words, in alphabetical order
+    std::uint32_t spelling;  // the number of letters, and EndsInQ
 };
+
+/// The last cube, a Qu, is the "q" alone.
+inline constexpr std::uint32_t EndsInQ = 0x100;
 
 /// Puts words in the order of their indexes. `room`: memory to use again, whatever it holds.
 void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room);

@@ -94,9 +94,7 @@ WordGraph ReducedTo(const WordGraph& words, std::size_t longest) {
 
 /// Words found on a board that is 16 letters.
 void SearchBoard(std::string_view letters) {
-    for (std::size_t i = 0; i < Found.board.size(); ++i) {
-        Found.board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
-    }
+    std::copy(letters.begin(), letters.end(), Found.board.begin());
     Found.isSorted = false;
     // Out of memory, a search is left in its midst, and must not be used again.
     auto search = Found.search ? std::move(Found.search) : std::make_unique<BoardSearch>();

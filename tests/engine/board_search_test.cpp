@@ -51,7 +51,7 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
     }
     Words found(const WordGraph& graph, const std::string& letters, SearchLimits limits) {
         Board board{};
-        for (std::size_t i = 0; i < 16; ++i) board[i] = static_cast<std::uint8_t>(letters[i] - 'a');
+        std::copy(letters.begin(), letters.end(), board.begin());
         std::vector<FoundWord> found;
         std::vector<FoundWord> room;
         search_->search(graph, board, limits, found);
