@@ -51,7 +51,7 @@ constexpr std::array<std::uint32_t, Cubes> MakeTouching() {
     return touching;
 }
 
-constexpr auto Touching = MakeTouching();
+constexpr auto TouchingCubes = MakeTouching();
 
 /// 1 when a < b, else 0. Both are below 2^31.
 constexpr std::uint32_t IsLess(std::uint32_t a, std::uint32_t b) {
@@ -86,6 +86,7 @@ struct BoardSearch::State {
     std::array<Chain, (Cubes + 1) * Block * MostTouching + 1> chains;
     std::array<Level, Cubes + 2> levels;
     CubeBits cubes;
+    std::array<std::uint32_t, Cubes> touching = TouchingCubes;  // where it is at hand
     RankSet found;
     RecentChains recent;  // once a board is hard
     std::vector<FoundWord>* out;
@@ -125,6 +126,7 @@ template <class Match, bool HasQu>
 inline void BoardSearch::State::run(NodeIndex root) {
     const Match match(cubes);
     chains[0] = {0, root, 0, 0, static_cast<std::uint16_t>(match(nodes[root])), 0};
+    if (chains[0].next == 0) return;
     levels[0] = {chains.data(), chains.data() + 1};
     std::size_t extended = 0;
     bool isHard = false;
@@ -154,11 +156,8 @@ template <class Match, bool HasQu>
 inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* chain,
                                               const Chain* end, Chain* to,
                                               std::uint32_t cubesUsed) {
-    std::uint32_t count = 0;
-    for (const Chain* each = chain; each != end; ++each) count += EdgeCount(each->next);
     Output output{to, words.data()};
-    std::uint32_t next = chain->next;
-    for (; count > 0; --count) {
+    for (std::uint32_t next = chain->next; chain != end;) {
         const auto cube = static_cast<std::uint32_t>(std::countr_zero(next));
         const Step step{chain->path << 4 | cube, chain->node, chain->firstWord,
                         HasQu ? chain->letters : cubesUsed};
@@ -186,7 +185,7 @@ inline void BoardSearch::State::extend(const Match& match, const Chain& chain, s
     }
     const std::uint32_t used = chain.used | (1U << cube);
     const std::uint32_t mayGoOn = 0 - IsLess(step.letters, maxLetters);
-    const std::uint32_t next = match(nodes[step.node]) & Touching[cube] & ~used & mayGoOn;
+    const std::uint32_t next = match(nodes[step.node]) & touching[cube] & ~used & mayGoOn;
     Chain& longer = *output.chains;
     longer.path = step.path;
     longer.node = step.node;
