@@ -6,6 +6,7 @@
 #include "hard_boards.h"
 #include "letter_match.h"
 #include "rank_set.h"
+#include "without_branches.h"
 
 // All chains of one length are extended together, so that their nodes are fetched side by side and
 // the inner loop runs long. When there are very many, they are taken in blocks, and each block's
@@ -15,9 +16,7 @@
 // so that one found along many chains counts once.
 //
 // The inner loop has no branch that depends on what the board shows: chains and words are written
-// first and counted after, and conditions are worked out as numbers, 0 or 1. They are numbers by
-// the sign of a difference, because the processor's way from a comparison to a number (a byte of
-// a register is set, and the rest of it waited for) makes one chain wait for another.
+// first and counted after.
 
 namespace {
 
@@ -52,11 +51,6 @@ constexpr std::array<std::uint32_t, Cubes> MakeTouching() {
 }
 
 constexpr auto TouchingCubes = MakeTouching();
-
-/// 1 when a < b, else 0. Both are below 2^31.
-constexpr std::uint32_t IsLess(std::uint32_t a, std::uint32_t b) {
-    return (a - b) >> 31;
-}
 
 /// On the way along a cube's letters.
 struct Step {

@@ -3,6 +3,7 @@
 #include <algorithm>
 
 #include "populate.h"
+#include "without_branches.h"
 
 // Links lead to nodes read before, so there are no cycles; words and heights add up as the nodes
 // come, so no walk of the finished graph is needed to know that it is sound.
@@ -18,8 +19,8 @@ inline bool CodeReader::read(std::uint32_t& code) {
     if (left() < 2 || isLong()) return readSlowly(code);
     const auto first = std::to_integer<std::uint32_t>(at_[0]);
     const auto second = std::to_integer<std::uint32_t>(at_[1]);
-    const std::uint32_t isTwo = first >= OneByteCodes ? 1 : 0;
-    code = first + ((0 - isTwo) & (((first - OneByteCodes) << 8) + second + OneByteCodes - first));
+    const std::uint32_t isTwo = 1 - IsLess(first, OneByteCodes);
+    code = Choose(isTwo, ((first - OneByteCodes) << 8) + second + OneByteCodes, first);
     at_ += 1 + isTwo;
     return true;
 }
@@ -49,7 +50,7 @@ std::shared_ptr<NodeStore> DictionaryDecoder::read() {
     cells_ = store_->words();
     Populate(cells_, all_ * sizeof *cells_);
     if (!readTables() || !readNodes() || !finished()) return nullptr;
-    store_->closeBase(header_.nodes == 0 ? NoNode : waiting_[0].node);
+    store_->closeBase(header_.nodes == 0 ? NoNode : nodes_[0].node);
     return std::move(store_);
 }
 
@@ -64,19 +65,20 @@ bool DictionaryDecoder::plausible() const {
 bool DictionaryDecoder::readTables() {
     masks_.resize(header_.masks);
     for (std::uint32_t& mask : masks_) mask = codes_.readFour();
-    known_.reserve(1 + std::size_t{header_.shared});
-    Populate(known_.data(), known_.capacity() * sizeof known_[0]);
-    known_.resize(1 + std::size_t{header_.shared});
-    shortLinks_[EndCode] = NothingKnown + 1;
+    const std::size_t count = MostWaiting + 1 + std::size_t{header_.shared};
+    nodes_.reserve(count);
+    Populate(nodes_.data(), count * sizeof nodes_[0]);
+    nodes_.resize(count);
+    shortLinks_[EndCode] = 1;
     shortLinks_[NewWordCode] = 1;
     std::uint32_t code = FirstSharedCode;
     for (std::uint32_t i = 0; i < header_.hotLinks; ++i) {
         const std::uint32_t link = codes_.readFour();
         if (link >> 1 >= header_.shared) return false;
-        shortLinks_[code++] = FirstKnown + link;
+        shortLinks_[code++] = FirstLink + link;
     }
     firstNumber_ = code;
-    for (; code < OneByteCodes; ++code) shortLinks_[code] = FirstKnown + code - firstNumber_;
+    for (; code < OneByteCodes; ++code) shortLinks_[code] = FirstLink + code - firstNumber_;
     return true;
 }
 
@@ -87,41 +89,41 @@ inline bool DictionaryDecoder::readNode(CodeReader& codes, std::uint32_t mask) {
     *cell++ = mask;
     std::uint64_t words = 0;
     std::uint32_t height = 0;
+    std::uint32_t waiting = waiting_;
     for (const std::uint32_t* end = cells_ + used_ + size; cell != end;) {
         Read child{};
         std::uint32_t wordEnds = 0;
-        if (!readLink(codes, child, wordEnds)) return false;
+        if (!readLink(codes, waiting, child, wordEnds)) return false;
         *cell++ = child.node | (wordEnds << 31);
         *cell++ = static_cast<std::uint32_t>(words);
         words += wordEnds + child.words;
         height = std::max(height, child.height + 1);
     }
-    if (words > INT32_MAX || height > LongestWord || waitingCount_ == MostWaiting) return false;
-    waiting_[waitingCount_++] = {static_cast<NodeIndex>(used_), static_cast<std::uint32_t>(words),
-                                 height};
+    if (words > INT32_MAX || height > LongestWord || waiting == MostWaiting) return false;
+    nodes_[waiting++] = {static_cast<NodeIndex>(used_), static_cast<std::uint32_t>(words), height};
+    waiting_ = waiting;
     used_ += size;
     return true;
 }
 
 // All kinds of links in one way, because which comes next cannot be foreseen.
-inline bool DictionaryDecoder::readLink(CodeReader& codes, Read& child, std::uint32_t& wordEnds) {
+inline bool DictionaryDecoder::readLink(CodeReader& codes, std::uint32_t& waiting, Read& child,
+                                        std::uint32_t& wordEnds) {
     std::uint32_t code = 0;
     if (!codes.read(code)) return false;
-    const std::uint32_t link = code < OneByteCodes ? shortLinks_[code & (OneByteCodes - 1)]
-                                                   : FirstKnown + (code - firstNumber_);
-    const std::uint32_t isNew = code - NewChildCode < 2 ? 1 : 0;
-    if (isNew > waitingCount_ || link >> 1 > sharedCount_) return false;
-    const Read* waiting = waiting_.data() + waitingCount_ - isNew;
-    const Read* known = known_.data() + (link >> 1);
-    child = *(isNew != 0 ? waiting : known);
+    const std::uint32_t link = Choose(IsLess(code, OneByteCodes), shortLinks_[code % OneByteCodes],
+                                      FirstLink + code - firstNumber_);
+    const std::uint32_t isNew = IsLess(code - NewChildCode, 2);
+    if (isNew > waiting || link >> 1 > shared_) return false;
+    child = nodes_[Choose(isNew, waiting - 1, MostWaiting + (link >> 1))];
+    waiting -= isNew;
     wordEnds = link & 1;
-    waitingCount_ -= isNew;
     return true;
 }
 
 inline bool DictionaryDecoder::share() {
-    if (waitingCount_ == 0 || sharedCount_ == header_.shared) return false;
-    known_[++sharedCount_] = waiting_[waitingCount_ - 1];
+    if (waiting_ == 0 || shared_ == header_.shared) return false;
+    nodes_[MostWaiting + ++shared_] = nodes_[waiting_ - 1];
     return true;
 }
 
@@ -143,10 +145,10 @@ inline bool DictionaryDecoder::share() {
 
 // Exactly one node has no parent, all counts are used up, and no word has one letter only.
 bool DictionaryDecoder::finished() const {
-    if (used_ != all_ || sharedCount_ != header_.shared) return false;
-    if (header_.nodes == 0) return header_.words == 0 && waitingCount_ == 0;
-    if (waitingCount_ != 1 || waiting_[0].words != header_.words) return false;
-    const std::uint32_t* root = cells_ + waiting_[0].node;
+    if (used_ != all_ || shared_ != header_.shared) return false;
+    if (header_.nodes == 0) return header_.words == 0 && waiting_ == 0;
+    if (waiting_ != 1 || nodes_[0].words != header_.words) return false;
+    const std::uint32_t* root = cells_ + nodes_[0].node;
     for (std::uint32_t i = 0; i < EdgeCount(root[0]); ++i) {
         if ((root[1 + 2 * i] & WordEnds) != 0) return false;
     }

@@ -45,13 +45,13 @@ class DictionaryDecoder {
         std::uint32_t height;  // letters of the longest one
     };
     // The nodes that wait for a parent: at most the later letters of every node on one path.
-    static constexpr std::size_t MostWaiting = LongestWord * Letters;
+    static constexpr std::uint32_t MostWaiting = LongestWord * Letters;
 
     bool plausible() const;
     bool readTables();
     bool readNodes();
     bool readNode(CodeReader& codes, std::uint32_t mask);
-    bool readLink(CodeReader& codes, Read& child, std::uint32_t& wordEnds);
+    bool readLink(CodeReader& codes, std::uint32_t& waiting, Read& child, std::uint32_t& wordEnds);
     bool share();
     bool finished() const;
 
@@ -62,13 +62,13 @@ class DictionaryDecoder {
     std::size_t used_ = 1;  // cells written
     std::size_t all_ = 1;   // cells that the header promises
     std::vector<std::uint32_t> masks_;
-    // A link is twice an index into known_, plus 1 when a word ends.
-    static constexpr std::uint32_t NothingKnown = 0;
-    static constexpr std::uint32_t FirstKnown = 2;
+    // A link is twice the place of a node behind those that wait, plus 1 when a word ends: nothing
+    // comes first there, then the shared nodes.
+    static constexpr std::uint32_t FirstLink = 2;
     std::array<std::uint32_t, OneByteCodes> shortLinks_{};  // of the codes of one byte
     std::uint32_t firstNumber_ = 0;                         // the code of number 0
-    std::vector<Read> known_;  // nothing, then the shared nodes by number
-    std::size_t sharedCount_ = 0;
-    std::array<Read, MostWaiting + 1> waiting_;
-    std::size_t waitingCount_ = 0;
+    // Those that wait in MostWaiting places, then nothing, then the shared nodes by number.
+    std::vector<Read> nodes_;
+    std::uint32_t waiting_ = 0;
+    std::uint32_t shared_ = 0;
 };
