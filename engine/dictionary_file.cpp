@@ -7,8 +7,7 @@
 #include "dictionary_codes.h"
 #include "dictionary_decoder.h"
 #include "dictionary_encoder.h"
-#include "graph_builder.h"
-#include "word_cursor.h"
+#include "graph_rebuild.h"
 
 static_assert(std::endian::native == std::endian::little, "headers are copied as they are");
 
@@ -16,14 +15,6 @@ namespace {
 
 constexpr std::uint32_t Magic = 0x64727551;  // "Qurd"
 constexpr std::uint16_t Version = 1;
-
-WordGraph Minimal(const WordGraph& words) {
-    if (words.isMinimal()) return words;
-    GraphBuilder builder;
-    WordCursor cursor(words);
-    for (std::string_view word; cursor.next(word);) builder.add(word);
-    return builder.finish();
-}
 
 std::uint32_t Checksum(std::span<const std::byte> bytes) {
     return Crc32c(Crc32c(0, bytes.first(ChecksumAt)), bytes.subspan(ChecksumAt + 4));
@@ -37,7 +28,8 @@ bool IsSound(const DictionaryHeader& header) {
 }  // namespace
 
 std::vector<std::byte> EncodeDictionary(const DictionaryContent& content) {
-    const WordGraph words = Minimal(content.words);
+    const bool isMinimal = content.words.isMinimal();
+    const WordGraph words = isMinimal ? content.words : Rebuilt(content.words, LongestWord);
     DictionaryHeader header{};
     header.magic = Magic;
     header.version = Version;

@@ -34,10 +34,7 @@ void GraphBuilder::add(std::string_view word) {
     for (std::size_t i = common; i < word.size(); ++i) {
         OpenNode& node = path_[i];
         last_[i] = word[i];
-        node.mask |= LetterBit(word[i]);
-        node.content[2 * node.edges] = NoNode;
-        node.content[2 * node.edges + 1] = node.words;
-        ++node.edges;
+        node.open(LetterBit(word[i]), NoNode);
         path_[i + 1].mask = path_[i + 1].edges = path_[i + 1].words = 0;
     }
     lastSize_ = word.size();
@@ -49,9 +46,13 @@ void GraphBuilder::add(std::string_view word) {
 
 WordGraph GraphBuilder::finish() {
     closeNodes(0);
-    nodes_->closeBase(store(path_[0]));
+    return finish(store(path_[0]), size_);
+}
+
+WordGraph GraphBuilder::finish(NodeIndex root, std::uint32_t words) {
+    nodes_->closeBase(root);
     nodes_->shrink();
-    return {std::move(nodes_), size_};
+    return {std::move(nodes_), words};
 }
 
 // Stores the nodes of the last word below `depth` letters, deepest first, and links to them.

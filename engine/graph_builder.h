@@ -8,6 +8,22 @@
 
 #include "word_graph.h"
 
+/// A node that is still open for more letters.
+struct OpenNode {
+    std::uint32_t mask = 0;
+    std::uint32_t edges = 0;
+    std::uint32_t words = 0;
+    std::array<std::uint32_t, 2 * Letters> content{};  // link, skip, link, skip, ...
+
+    /// `bit`: of a letter after all that are there. The words below it are yet to be counted.
+    void open(std::uint32_t bit, std::uint32_t link) {
+        mask |= bit;
+        content[2 * edges] = link;
+        content[2 * edges + 1] = words;
+        ++edges;
+    }
+};
+
 /// Takes words in strictly ascending order, one by one, each in bounded time; so is finishing.
 class GraphBuilder {
   public:
@@ -20,15 +36,13 @@ class GraphBuilder {
     /// The graph of all words added. The builder is of no more use.
     WordGraph finish();
 
-  private:
-    // A node on the path of the word added last, still open for more letters.
-    struct OpenNode {
-        std::uint32_t mask = 0;
-        std::uint32_t edges = 0;
-        std::uint32_t words = 0;
-        std::array<std::uint32_t, 2 * Letters> content{};  // link, skip, link, skip, ...
-    };
+    /// Instead of words, nodes can be stored one by one, children first: the stored node of this
+    /// content, one that was there before or a new one. NoNode when it has no letters.
+    NodeIndex store(const OpenNode& open);
+    /// The graph of the node stored last, or of none.
+    WordGraph finish(NodeIndex root, std::uint32_t words);
 
+  private:
     // The stored nodes by their content: a hash table with open addressing.
     struct Slot {
         NodeIndex node;  // NoNode: free
@@ -44,7 +58,6 @@ class GraphBuilder {
     };
 
     void closeNodes(std::size_t depth);
-    NodeIndex store(const OpenNode& open);
     NodeIndex append(const OpenNode& open);
     Slot& find(const Register& table, const OpenNode& open, std::uint32_t hash) const;
     void growRegister();

@@ -9,6 +9,7 @@
 #include "current_dictionary.h"
 #include "damaged_file.h"
 #include "dictionary_file.h"
+#include "graph_rebuild.h"
 #include "read_file.h"
 #include "replace_file.h"
 #include "settings_file.h"
@@ -80,16 +81,6 @@ bool LoadDictionary(const char* path) {
     TheDictionary.words = std::move(content.words);
     TheDictionary.maxWordSize = content.maxWordSize;
     return true;
-}
-
-/// The words of at most `longest` letters.
-WordGraph ReducedTo(const WordGraph& words, std::size_t longest) {
-    GraphBuilder builder;
-    WordCursor cursor(words);
-    for (std::string_view word; cursor.next(word);) {
-        if (word.size() <= longest) builder.add(word);
-    }
-    return builder.finish();
 }
 
 /// Words found on a board that is 16 letters.
@@ -239,7 +230,7 @@ int32_t cSetMaxWordSize(int32_t size) {
 int32_t cReduceWordSize(void) {
     return Guarded(0, [&] {
         TheDictionary.words =
-            ReducedTo(TheDictionary.words, static_cast<std::size_t>(TheDictionary.maxWordSize));
+            Rebuilt(TheDictionary.words, static_cast<std::uint32_t>(TheDictionary.maxWordSize));
         return 1;
     });
 }

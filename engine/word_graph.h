@@ -53,6 +53,8 @@ class WordGraph {
     /// For those who walk the nodes themselves; see node_store.h. Valid until the next edit.
     const std::uint32_t* nodes() const;
     NodeIndex root() const { return root_; }
+    /// Above the index of every node.
+    std::size_t nodesEnd() const { return store_ ? store_->size() : 1; }
 
     /// Follows `letters` from the root; false when no word begins with them.
     bool find(std::string_view letters, GraphPlace& place) const;
