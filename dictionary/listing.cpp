@@ -88,10 +88,11 @@ void ShowEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     if (editor.isVisible()) return;
     QWidget* inFront = QApplication::activeWindow();
-    const bool playing = State.TimeRemaining != 0;
-    editor.setAttribute(Qt::WA_ShowWithoutActivating, playing);
+    // Nor may it cover a box that has to be answered first.
+    const bool behind = State.TimeRemaining != 0 || QApplication::activeModalWidget() != nullptr;
+    editor.setAttribute(Qt::WA_ShowWithoutActivating, behind);
     editor.show();
-    if (playing && inFront != nullptr) inFront->activateWindow();
+    if (behind && inFront != nullptr) inFront->activateWindow();
 }
 
 }  // namespace Dictionary

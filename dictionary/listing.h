@@ -14,8 +14,8 @@ void ListStartingLetters(Boolean ResetSelection);
 /// the editor.
 void ListWords();
 
-/// Shows the editor where it is hidden. During a game it takes no focus: what
-/// the player types belongs to the game.
+/// Shows the editor where it is hidden. During a game or a message box it takes
+/// no focus: what the player types belongs there.
 void ShowEditor();
 
 }  // namespace Dictionary

@@ -8,6 +8,7 @@
 #include <cstdio>
 #include <filesystem>
 #include <fstream>
+#include <set>
 #include <string>
 #include <string_view>
 
@@ -62,19 +63,47 @@ inline void Merge(const std::string& path) {
     REQUIRE(percent == 100);
 }
 
-/// The words of a listing, which must ascend.
+/// Reads what a listing has left; its words must ascend.
 template <typename Words>
-void List(std::int32_t first, std::int32_t second, Words& words) {
-    char buffer[16];
+void ReadListing(Words& words) {
+    char buffer[17] = {};
     std::string last;
-    REQUIRE(cStartDecodingWords(first, second) == 1);
     while (const std::int16_t length = cDecodeNextWord(buffer)) {
         REQUIRE(length >= 2 && length <= 16);
         const std::string word(buffer, static_cast<std::size_t>(length));
-        REQUIRE(last < word && word[0] == 'a' + first && word[1] == 'a' + second);
+        REQUIRE(last < word);
         words.insert(words.end(), word);
         last = word;
     }
+}
+
+template <typename Words>
+void List(std::int32_t first, std::int32_t second, Words& words) {
+    REQUIRE(cStartDecodingWords(first, second) == 1);
+    ReadListing(words);
+}
+
+inline std::set<std::string> AllWords() {
+    std::set<std::string> words;
+    for (std::int32_t first = 0; first < 26; ++first) {
+        for (std::int32_t second = 0; second < 26; ++second) List(first, second, words);
+    }
+    return words;
+}
+
+/// The results of a search, which must ascend and be as many as it said.
+inline std::set<std::string> Results(std::int32_t count) {
+    std::set<std::string> words;
+    for (std::int32_t i = -1; i <= count; ++i) {
+        char buffer[17] = {};
+        std::int32_t length = 16;
+        const bool inside = i >= 0 && i < count;
+        REQUIRE(cGetDefinedWord(i, buffer, &length) == (inside ? 1 : 0));
+        REQUIRE(length == static_cast<std::int32_t>(std::string_view(buffer).size()));
+        if (inside) REQUIRE(std::next(words.insert(words.end(), buffer)) == words.end());
+    }
+    REQUIRE(static_cast<std::int32_t>(words.size()) == count);
+    return words;
 }
 
 }  // namespace Fuzz

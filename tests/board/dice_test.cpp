@@ -3,37 +3,24 @@
 
 #include <set>
 
-#include "support/boards.h"
 #include "support/game_fixture.h"
 
 namespace {
 
-class ShakenCubes : public GameFixture {
-  protected:
-    ShakenCubes() { Dice::FillCubeFaces(); }
-};
+class ShakenCubes : public GameFixture {};
 
 TEST_F(ShakenCubes, DrawACubeAndThenItsFaceForEachPlace) {
-    draws_.assign(32, 0.0F);
-    EXPECT_EQ(Dice::ShakeCubes(), "ETISSOYWOOIVAATI");
+    Dice::FillCubeFaces();
     draws_.assign(32, 0x1.fffffep-1F);
     EXPECT_EQ(Dice::ShakeCubes(), "YLCNISBDUERRNBBP");
-    EXPECT_EQ(drawn_, 64);
-
+    EXPECT_EQ(drawn_, 32);
     draws_.assign(32, 0.0F);
     draws_[0] = 9.5F / 16;  // the tenth cube first, its second face
     draws_[1] = 1.5F / 6;
     draws_[2] = 9.5F / 15;  // and now the eleventh, the tenth being taken
     EXPECT_EQ(Dice::ShakeCubes(), "QIETISSOYWOVAATI");
-}
-
-TEST_F(ShakenCubes, ComeFromSixteenCubesInEveryOrder) {
     std::set<char> corner;
-    for (int i = 0; i < 1000; ++i) {
-        const std::string shake = Dice::ShakeCubes();
-        ASSERT_NO_THROW(DrawsFor(shake)) << shake;
-        corner.insert(shake.back());
-    }
+    for (int i = 0; i < 1000; ++i) corner.insert(Dice::ShakeCubes().back());
     EXPECT_EQ(corner.size(), 26U);  // every letter of the cubes comes to the last place
 }
 

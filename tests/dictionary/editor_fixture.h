@@ -2,13 +2,9 @@
 // The dictionary editor open on a small dictionary.
 #include <quorle/word_engine.h>
 
-#include <QAction>
 #include <QComboBox>
-#include <QFile>
 #include <QTest>
-#include <string>
 
-#include "dictionary/dictionary.h"
 #include "support/program_fixture.h"
 
 class OpenEditor : public ProgramFixture {
@@ -21,31 +17,20 @@ class OpenEditor : public ProgramFixture {
 
     QComboBox& prefixes() { return *qobject_cast<QComboBox*>(control("StartingLetters")); }
 
-    std::string offered() {
-        QStringList all;
-        for (int i = 0; i < prefixes().count(); ++i) all += prefixes().itemText(i);
-        return all.join(' ').toStdString();
+    /// The prefixes, the selected one and its words, and the count.
+    std::string shown() {
+        QString all;
+        for (int i = 0; i < prefixes().count(); ++i) all += prefixes().itemText(i) + " ";
+        all += "| " + prefixes().currentText() + ":";
+        for (const auto& word : words("DictionaryEditor/WordList")) {
+            all += " " + QString::fromStdString(word);
+        }
+        return all.toStdString() + " | " + text("WordCount");
     }
-
-    std::string selectedPrefix() { return prefixes().currentText().toStdString(); }
-
-    Words listed() { return words("DictionaryEditor/WordList"); }
-
-    void menu(const char* command) {
-        control("DictionaryEditor")->findChild<QAction*>(command)->trigger();
-    }
-
-    void enter(const std::string& word) {
-        EXPECT_TRUE(QTest::qWaitForWindowActive(control("DictionaryEditor")));
-        type(word);
-        key(Qt::Key_Return);
-    }
-
-    static bool holds(const std::string& word) { return Dictionary::IsInDictionary(word); }
 
     /// Number of words in the program folder's file; the engine then holds them.
-    static int wordsOnDisk() {
-        Dictionary::LoadDictionary();
+    int wordsOnDisk() {
+        cReadBinaryDictionary((folder_ / "program/Dictionary.dat").c_str());
         return cNumberOfWords();
     }
 };

@@ -7,31 +7,26 @@ using Editor = OpenEditor;
 
 TEST_F(Editor, AddsTypedWordsOneAfterAnother) {
     prefixes().setCurrentText("CA");
-    for (const char* word : {"Apt", "CAPE", "sixteenlettersab"}) {
-        type(word);
-        key(Qt::Key_Return);
-        EXPECT_EQ(text("DictionaryEditor/NewWord"), "");
-    }
-    EXPECT_EQ(listed(), (Words{"cab", "cape", "cat"}));
-    EXPECT_EQ(offered(), "AP BO CA SI ZO");
-    EXPECT_EQ(selectedPrefix(), "CA");
-    EXPECT_EQ(text("WordCount"), "7 words");
+    enter({"Apt", "CAPE", "sixteenlettersab"});
+    EXPECT_EQ(text("DictionaryEditor/NewWord"), "");
+    EXPECT_EQ(shown(), "AP BO CA SI ZO | CA: cab cape cat | 7 words");
     EXPECT_TRUE(State.DictionaryChanged);
     type("cow");
     select("DictionaryEditor/WordList", "cat");
     key(Qt::Key_Enter, Qt::KeypadModifier);
-    EXPECT_TRUE(holds("cow"));
+    EXPECT_EQ(text("WordCount"), "8 words");
 }
 
 TEST_F(Editor, RefusesWhatIsNoWordOfThreeToSixteenLetters) {
     const std::string length = "Words must be 3 to 16 letters long.";
     const std::string letters = "Word has a non-alphabetic character, no added.";
-    const std::vector<std::pair<std::string, std::string>> refused{
-        {"at", length},         {"seventeenlettersx", length}, {"don't", letters},
-        {"two words", letters}, {"caf\u00e9", letters},        {"ab1", letters}};
-    for (const auto& [word, message] : refused) {
-        boxes_.expect("Quorle", message, QMessageBox::Ok, QMessageBox::Ok);
-        enter(word);
+    for (const auto& [word, message] : {std::pair("at", length),
+                                        {"seventeenlettersx", length},
+                                        {"don't", letters},
+                                        {"caf\u00e9", letters}}) {
+        boxes_.expectMessage(message);
+        bringToFront("DictionaryEditor");
+        enter({word});
         EXPECT_EQ(text("DictionaryEditor/NewWord"), "");
     }
     EXPECT_EQ(cNumberOfWords(), 4);
@@ -39,38 +34,29 @@ TEST_F(Editor, RefusesWhatIsNoWordOfThreeToSixteenLetters) {
 }
 
 TEST_F(Editor, RemovesTheSelectedWordAndKeepsThePrefixWhileItLasts) {
-    QWidget* list = control("DictionaryEditor/WordList");
     prefixes().setCurrentText("CA");
     select("DictionaryEditor/WordList", "cat");
     press("Remove");
-    EXPECT_EQ(listed(), Words{"cab"});
-    EXPECT_FALSE(holds("cat"));
+    EXPECT_EQ(shown(), "BO CA ZO | CA: cab | 3 words");
     EXPECT_TRUE(State.DictionaryChanged);
-    EXPECT_TRUE(list->hasFocus());
-    boxes_.expect("Quorle", "You must select a word to remove.", QMessageBox::Ok, QMessageBox::Ok,
-                  [] { cDictionaryAdd("cane"); });
+    EXPECT_TRUE(control("DictionaryEditor/WordList")->hasFocus());
+    boxes_.expectMessage("You must select a word to remove.", [] { cDictionaryAdd("cane"); });
     press("Remove");
-    EXPECT_EQ(listed(), (Words{"cab", "cane"}));
+    EXPECT_EQ(shown(), "BO CA ZO | CA: cab cane | 4 words");
     for (const char* word : {"cane", "cab"}) {
         select("DictionaryEditor/WordList", word);
         press("Remove");
     }
-    EXPECT_EQ(offered(), "BO ZO");
-    EXPECT_EQ(selectedPrefix(), "BO");
-    EXPECT_EQ(listed(), Words{"bone"});
+    EXPECT_EQ(shown(), "BO ZO | BO: bone | 2 words");
 }
 
 TEST_F(Editor, ClearsAfterAQuestionAndOffersNoSaving) {
-    const auto buttons = QMessageBox::Yes | QMessageBox::No;
-    boxes_.expect("Quorle", "Clear the dictionary?", buttons, QMessageBox::No);
-    menu("Clear");
-    EXPECT_EQ(cNumberOfWords(), 4);
-    boxes_.expect("Quorle", "Clear the dictionary?", buttons, QMessageBox::Yes);
-    menu("Clear");
-    EXPECT_EQ(offered(), "");
-    EXPECT_EQ(listed(), Words{});
-    EXPECT_EQ(text("WordCount"), "0 words");
-    EXPECT_TRUE(isShown("DictionaryEditor"));
+    for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
+        EXPECT_EQ(cNumberOfWords(), 4);
+        boxes_.expectQuestion("Clear the dictionary?", answer);
+        menu("DictionaryEditor/Clear");
+    }
+    EXPECT_EQ(shown(), "| : | 0 words");
     press("Main/Exit");
     EXPECT_FALSE(isShown("DictionaryEditor"));
     EXPECT_EQ(wordsOnDisk(), 4);
@@ -82,27 +68,17 @@ TEST_F(Editor, SavesEveryWordAsText) {
         EXPECT_EQ(folder, folder_ / "program");
         return path;
     };
-    menu("SaveAs");
+    menu("DictionaryEditor/SaveAs");
     path = folder_ / "words.txt";
-    menu("SaveAs");
-    QFile file(QString::fromStdString(path));
-    ASSERT_TRUE(file.open(QFile::ReadOnly));
-    EXPECT_EQ(file.readAll(), "bone\ncab\ncat\nzoo\n");
+    menu("DictionaryEditor/SaveAs");
+    EXPECT_EQ(folder_.read("words.txt"), "bone\ncab\ncat\nzoo\n");
     EXPECT_FALSE(State.DictionaryChanged);
 }
 
-TEST_F(Editor, IsLeftInThreeWaysForTheMainWindow) {
-    const std::vector<std::function<void()>> ways{[this] { key(Qt::Key_Escape); },
-                                                  [this] { menu("Exit"); },
-                                                  [this] { closeByTitleBar("DictionaryEditor"); }};
-    for (const auto& leave : ways) {
-        press("Dictionary");
-        bringToFront("DictionaryEditor");
-        leave();
-        EXPECT_FALSE(isShown("DictionaryEditor"));
-        EXPECT_EQ(listed(), Words{});
-        EXPECT_TRUE(QTest::qWaitForWindowActive(control("Main")));
-    }
+TEST_F(Editor, IsLeftForTheMainWindow) {
+    key(Qt::Key_Escape);
+    EXPECT_FALSE(isShown("DictionaryEditor"));
+    EXPECT_TRUE(comesToFront("Main"));
 }
 
 }  // namespace

@@ -5,34 +5,18 @@
 #include "board_search.h"
 #include "graph_builder.h"
 #include "random_words.h"
+#include "support/chains.h"
 
 namespace {
 
 using Words = std::set<std::string>;
-
-/// Whether the rest of a word lies on the board, going on from `cube` (-1: anywhere). A Qu cube
-/// is "qu", or a "q" that ends the word.
-bool Lies(const std::string& board, std::string_view rest, int cube, int used) {
-    if (rest.empty()) return true;
-    for (int next = 0; next < 16; ++next) {
-        const int rows = next / 4 - cube / 4;
-        const int columns = next % 4 - cube % 4;
-        const bool touches = rows * rows <= 1 && columns * columns <= 1;
-        if ((used >> next & 1) != 0 || (cube >= 0 && !touches)) continue;
-        std::string_view face = std::string_view(board).substr(static_cast<std::size_t>(next), 1);
-        if (face == "q" && rest.size() > 1) face = "qu";
-        if (!rest.starts_with(face)) continue;
-        if (Lies(board, rest.substr(face.size()), next, used | 1 << next)) return true;
-    }
-    return false;
-}
 
 Words OnBoard(const Words& words, const std::string& board, SearchLimits limits) {
     Words found;
     for (const std::string& word : words) {
         const auto size = static_cast<int>(word.size());
         const bool counts = size >= limits.minLetters && size <= limits.maxLetters;
-        if (counts && Lies(board, word, -1, 0)) found.insert(word);
+        if (counts && Lies(board, word)) found.insert(word);
     }
     return found;
 }

@@ -22,6 +22,7 @@ class TempFolder {
     const std::filesystem::path& path() const { return path_; }
 
     void write(const std::string& name, const std::string& text) const {
+        std::filesystem::create_directories((path_ / name).parent_path());
         std::ofstream(path_ / name, std::ios::binary) << text;
     }
     std::string read(const std::string& name) const {

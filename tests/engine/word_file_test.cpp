@@ -1,4 +1,4 @@
-// Merging and writing word files, through the interface.
+// Merging word files in steps, through the interface.
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 
@@ -24,36 +24,30 @@ class WordFile : public testing::Test {
     std::int32_t start(const std::string& name) const {
         return cReadTextFile((folder_ / name).c_str());
     }
-
-    /// Steps to the end; percentages never fall. Returns the number of steps.
-    static int finish(std::int32_t percent) {
-        int steps = 0;
-        while (percent < 100) {
-            const std::int32_t next = cReadTextFile("dummy");
-            EXPECT_GE(next, percent);
-            percent = next;
-            ++steps;
-        }
-        EXPECT_EQ(percent, 100);
-        return steps;
+    static std::int32_t step(std::int32_t percent, const char* path = "dummy") {
+        const std::int32_t next = cReadTextFile(path);
+        EXPECT_TRUE(next >= percent && next <= 100);
+        return next;
     }
-
+    static void finish(std::int32_t percent) {
+        while (percent < 100) percent = step(percent);
+    }
     Words held() const {
         EXPECT_EQ(cWriteTextFile((folder_ / "held").c_str()), 1);
         std::ifstream file(folder_ / "held");
         return {std::istream_iterator<std::string>(file), {}};
     }
+    std::size_t below(std::size_t n) { return random_() % n; }
 
-    /// A file of many words "b..." in no order, more than one step can take.
-    Words writeMany(const std::string& name, unsigned seed, std::size_t number = 200'000) const {
-        std::minstd_rand random(seed);
+    /// A file of many words "b..." in no order, more than a few steps can take.
+    Words writeMany(const std::string& name) {
         std::string text;
         Words words;
-        while (words.size() < number) {
-            std::string word(2 + random() % 15, 'b');
-            for (char& c : word) c = static_cast<char>('a' + random() % 26);
+        while (words.size() < 270'000) {
+            std::string word(2 + below(15), 'b');
+            for (char& c : word) c = static_cast<char>('a' + below(26));
             word[0] = 'b';
-            text += word + (random() % 2 == 0 ? "\n" : "\r\n");
+            text += word + (below(2) == 0 ? "\n" : "\r\n");
             words.insert(word);
         }
         folder_.write(name, text);
@@ -61,123 +55,70 @@ class WordFile : public testing::Test {
     }
 
     TempFolder folder_;
+    std::minstd_rand random_;
 };
 
-Words With(Words words, const Words& more) {
-    words.insert(more.begin(), more.end());
-    return words;
-}
-
-Words UpTo(std::size_t size, Words words) {
-    std::erase_if(words, [size](const auto& word) { return word.size() > size; });
-    return words;
-}
-
-TEST_F(WordFile, TakesTheWordsAndNothingElse) {
-    using namespace std::string_literals;
-    folder_.write("words",
-                  "\xEF\xBB\xBF"
-                  "first\nSecond\r\n\tTHIRD  a don't caf\xC3\xA9 no1 nul\0nul\v"
-                  "abcdefghijklmnop\fabcdefghijklmnopq [ab] {ab z@z \xEF\xBB\xBF"
-                  "mark\n\nlast"s);
-    finish(start("words"));
-    EXPECT_EQ(held(), (Words{"first", "second", "third", "abcdefghijklmnop", "last"}));
-    folder_.write("utf16",
-                  "\xFF\xFE"
-                  "c\0a\0t\0\n\0"s);
-    folder_.write("empty", "");
-    cSetMaxWordSize(5);
-    folder_.write("short", "abcdef fives");
-    for (const char* name : {"utf16", "empty", "short", "short"}) finish(start(name));
-    EXPECT_EQ(held(), (Words{"first", "second", "third", "abcdefghijklmnop", "last", "fives"}));
-}
-
-TEST_F(WordFile, IsWrittenSortedAWordALine) {
-    EXPECT_EQ(cWriteTextFile((folder_ / "file").c_str()), 1);
-    EXPECT_EQ(folder_.read("file"), "");
-    for (const char* word : {"zebra", "ab", "abcdefghijklmnop", "abc"}) cDictionaryAdd(word);
-    EXPECT_EQ(cWriteTextFile((folder_ / "file").c_str()), 1);
-    EXPECT_EQ(folder_.read("file"), "ab\nabc\nabcdefghijklmnop\nzebra\n");
-    EXPECT_EQ(cWriteTextFile((folder_ / "no/file").c_str()), 0);
-}
-
-TEST_F(WordFile, IsMergedAllAtOnceWithTheEditsMadeMeanwhile) {
-    cDictionaryAdd("removed");
-    cDictionaryAdd("stays");
-    const Words many = writeMany("many", 1, 270'000);  // runs are merged before the end
-    std::int32_t percent = start("many");
-    int steps = 0;
-    for (; percent < 100; percent = cReadTextFile(nullptr), ++steps) {
-        EXPECT_GE(percent, 0);
-        EXPECT_EQ(cNumberOfWords(), 2 + std::min(steps, 1));
-        if (steps == 0) cDictionaryAdd("added");
-        if (steps == 6) {
-            cDictionaryAdd("later");
-            cDictionaryRemove("removed");
-        }
-    }
-    EXPECT_GT(steps, 8);
-    EXPECT_EQ(held(), With(many, {"stays", "added", "later"}));
-}
-
-TEST_F(WordFile, IsMergedIntoWhatTheDictionaryIsAtTheEnd) {
-    const Words many = writeMany("many", 2);
-    cDictionaryAdd("saved");
-    ASSERT_EQ(cWriteBinaryDictionary((folder_ / "Dictionary.dat").c_str()), 1);
-    for (const int moment : {0, 50}) {  // while reading, while building
-        cSetMaxWordSize(4);
-        std::int32_t percent = start("many");
-        while (percent < moment) percent = cReadTextFile("dummy");
-        ASSERT_LT(percent, 100);
-        cDictionaryAdd("cleared");
+TEST_F(WordFile, IsMergedAllAtOnceIntoWhatTheDictionaryIsAtTheEnd) {
+    const std::string saved = folder_ / "Dictionary.dat";
+    ASSERT_EQ(cDictionaryAdd("saved"), 1);
+    ASSERT_EQ(cWriteBinaryDictionary(saved.c_str()), 1);
+    const Words many = writeMany("many");
+    for (int run = 0; run < 3; ++run) {
         cDictionaryClear();
-        EXPECT_EQ(cReadBinaryDictionary((folder_ / "Dictionary.dat").c_str()), 1);
-        cSetMaxWordSize(9);
-        finish(percent);
-        EXPECT_EQ(held(), With(UpTo(9, many), {"saved"}));
+        Words expected;
+        std::size_t max = 16;
+        cSetMaxWordSize(16);
+        const auto edit = [&] {
+            const std::string word(2 + below(9), 'z');
+            if (below(3) == 0) {
+                EXPECT_EQ(cDictionaryRemove(word.c_str()), static_cast<int>(expected.erase(word)));
+            } else if (cDictionaryAdd(word.c_str()) == 1) {
+                expected.insert(word);
+            }
+            if (run == 0 || below(3) != 0) return;
+            const bool clear = below(2) == 0;
+            EXPECT_EQ(clear ? cDictionaryClear() : cReadBinaryDictionary(saved.c_str()), 1);
+            expected = clear ? Words{} : Words{"saved"};
+            cSetMaxWordSize(static_cast<int>(max = 5 + below(9)));
+        };
+        int steps = 0;
+        for (std::int32_t percent = start("many"); percent < 100; ++steps) {
+            edit();
+            EXPECT_EQ(cNumberOfWords(), static_cast<int>(expected.size()));
+            percent = step(percent, below(2) == 0 ? nullptr : "dummy");
+        }
+        EXPECT_GT(steps, 8);
+        ASSERT_LT(steps, 10'000);
+        for (const auto& word : many) {
+            if (word.size() <= max) expected.insert(expected.end(), word);
+        }
+        EXPECT_TRUE(held() == expected);
     }
-}
-
-TEST_F(WordFile, EndsForAPlayerWhoEditsAtEveryStep) {
-    const Words many = writeMany("many", 3);
-    Words edits;
-    for (std::int32_t percent = start("many"); percent < 100; percent = cReadTextFile("dummy")) {
-        const std::string word = "zz" + std::string(edits.size() % 14, 'z');
-        cDictionaryAdd(word.c_str());
-        edits.insert(word);
-        ASSERT_LT(edits.size(), 10'000U);
-        cDictionaryRemove("zzz");
-    }
-    edits.erase("zzz");
-    EXPECT_EQ(held(), With(many, edits));
 }
 
 TEST_F(WordFile, WaitsInLine) {
-    const Words many = writeMany("many", 4);
+    Words expected = writeMany("many");
     for (const char* name : {"second", "vanishes", "third"}) folder_.write(name, name);
     std::int32_t percent = start("many");
-    ASSERT_LT(percent, 100);
     for (const char* name : {"second", "missing", "many", "vanishes", "third"}) {
-        const std::int32_t next = start(name);
-        EXPECT_TRUE(next >= percent && next < 100);
-        percent = next;
+        percent = step(percent, (folder_ / name).c_str());
+        EXPECT_LT(percent, 100);
     }
-    EXPECT_EQ(cNumberOfWords(), 0);
     std::filesystem::remove(folder_ / "vanishes");
     std::filesystem::remove(folder_ / "many");  // open already, but gone when it comes again
     finish(percent);
-    EXPECT_EQ(held(), With(many, {"second", "third"}));
+    expected.insert({"second", "third"});
+    EXPECT_TRUE(held() == expected);
 }
 
 TEST_F(WordFile, LeavesTheDictionaryAloneWhenItCannotBeRead) {
     cDictionaryAdd("stays");
     ASSERT_EQ(mkfifo((folder_ / "pipe").c_str(), 0600), 0);
-    for (const char* name : {"pipe", "missing", "", "missing/file"}) {
-        EXPECT_EQ(start(name), 100) << name;
+    for (const std::string& path :
+         {folder_ / "pipe", folder_ / "", folder_ / "missing/file", std::string("/dev/zero")}) {
+        EXPECT_EQ(cReadTextFile(path.c_str()), 100) << path;
+        EXPECT_EQ(cReadBinaryDictionary(path.c_str()), 0) << path;
     }
-    EXPECT_EQ(cReadTextFile("/dev/zero"), 100);
-    EXPECT_EQ(cReadTextFile(nullptr), 100);
-    EXPECT_EQ(cReadTextFile("dummy"), 100);
     EXPECT_EQ(held(), Words{"stays"});
 }
 

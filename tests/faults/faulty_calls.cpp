@@ -74,44 +74,31 @@ ssize_t write(int file, const void* data, size_t size) {
 ssize_t read(int file, void* data, size_t size) {
     return Transfer("read", SYS_read, file, data, size);
 }
-int close(int file) {
-    return static_cast<int>(Perform("close", SYS_close, file));
-}
-int fsync(int file) {
-    return static_cast<int>(Perform("fsync", SYS_fsync, file));
-}
-int fchmod(int file, mode_t mode) {
-    return static_cast<int>(Perform("fchmod", SYS_fchmod, file, mode));
-}
-int fchown(int file, uid_t owner, gid_t group) {
-    return static_cast<int>(Perform("fchown", SYS_fchown, file, owner, group));
-}
-int flock(int file, int operation) {
-    return static_cast<int>(Perform("flock", SYS_flock, file, operation));
-}
-int fstat(int file, struct stat* status) {
-    return static_cast<int>(Perform("fstat", SYS_fstat, file, status));
-}
-int fstatat(int folder, const char* path, struct stat* status, int flags) {
-    return static_cast<int>(Perform("fstatat", SYS_newfstatat, folder, path, status, flags));
-}
-int unlinkat(int folder, const char* path, int flags) {
-    return static_cast<int>(Perform("unlinkat", SYS_unlinkat, folder, path, flags));
-}
-int linkat(int from, const char* path, int to, const char* name, int flags) {
-    if (Armed && Now.noLinks) {
-        errno = EPERM;
-        return -1;
-    }
-    return static_cast<int>(Perform("linkat", SYS_linkat, from, path, to, name, flags));
-}
-int renameat(int from, const char* path, int to, const char* name) {
-    return static_cast<int>(Perform("renameat", SYS_renameat, from, path, to, name));
-}
 ssize_t readlinkat(int folder, const char* path, char* link, size_t size) {
     return Perform("readlinkat", SYS_readlinkat, folder, path, link, size);
 }
-int mkdir(const char* path, mode_t mode) {
-    return static_cast<int>(Perform("mkdir", SYS_mkdir, path, mode));
+int linkat(int from, const char* path, int to, const char* name, int flags) {
+    const bool possible = !Armed || !Now.noLinks;
+    if (possible)
+        return static_cast<int>(Perform("linkat", SYS_linkat, from, path, to, name, flags));
+    errno = EPERM;
+    return -1;
 }
+
+#define CALL(name, number, parameters, ...)                           \
+    int name parameters {                                             \
+        return static_cast<int>(Perform(#name, number, __VA_ARGS__)); \
+    }
+CALL(close, SYS_close, (int file), file)
+CALL(fsync, SYS_fsync, (int file), file)
+CALL(fchmod, SYS_fchmod, (int file, mode_t mode), file, mode)
+CALL(fchown, SYS_fchown, (int file, uid_t owner, gid_t group), file, owner, group)
+CALL(flock, SYS_flock, (int file, int operation), file, operation)
+CALL(fstat, SYS_fstat, (int file, struct stat* status), file, status)
+CALL(fstatat, SYS_newfstatat, (int folder, const char* path, struct stat* status, int flags),
+     folder, path, status, flags)
+CALL(unlinkat, SYS_unlinkat, (int folder, const char* path, int flags), folder, path, flags)
+CALL(renameat, SYS_renameat, (int from, const char* path, int to, const char* name), from, path, to,
+     name)
+CALL(mkdir, SYS_mkdir, (const char* path, mode_t mode), path, mode)
 }

@@ -1,5 +1,3 @@
-#include <QAction>
-#include <QFile>
 #include <QTextBrowser>
 
 #include "support/program_fixture.h"
@@ -11,62 +9,46 @@ int Messages = 0;  // written to the terminal by the toolkit
 class Help : public ProgramFixture {
   protected:
     Help() {
-        write("Quorle.htm", "<title>T</title><p><a href=\"more.htm\">more</a> <p>Help");
-        write("more.htm", "<p>More");
+        folder_.write("program/Quorle.htm", "<p><a href=\"more.htm\">more</a> <p>Help");
+        folder_.write("program/more.htm", "<p>More");
         launch();
+        press("HelpButton");
     }
-
-    void write(const char* name, const QByteArray& page) {
-        QFile file(QString::fromStdString(folder_ / "program/") + name);
-        EXPECT_TRUE(file.open(QFile::WriteOnly));
-        file.write(page);
-    }
-
     QTextBrowser& viewer() { return *qobject_cast<QTextBrowser*>(control("WebBrowser")); }
 
-    std::string page() { return viewer().source().fileName().toStdString(); }
-
-    void command(const char* name) { control("HelpBrowser")->findChild<QAction*>(name)->trigger(); }
-
-    void followLink() {
-        viewer().setFocus();
-        key(Qt::Key_Tab);
-        key(Qt::Key_Return);
+    /// The page shown after a menu command.
+    std::string after(const std::string& command) {
+        menu("HelpBrowser/" + command);
+        return viewer().source().fileName().toStdString();
     }
 };
 
 TEST_F(Help, WalksThroughTheHistoryThatTheTitleBarDrops) {
-    press("HelpButton");
     bringToFront("HelpBrowser");
     EXPECT_EQ(viewer().geometry().bottom(), control("HelpBrowser")->rect().bottom());
-    command("Back");
-    command("Forward");
-    EXPECT_EQ(page(), "Quorle.htm");
-    followLink();
-    EXPECT_EQ(page(), "more.htm");
+    EXPECT_EQ(after("Back"), "Quorle.htm");
+    EXPECT_EQ(after("Forward"), "Quorle.htm");
+    viewer().setFocus();
+    key(Qt::Key_Tab);
+    key(Qt::Key_Return);  // follows the link
     EXPECT_EQ(viewer().toPlainText(), "More");
-    command("Back");
-    EXPECT_EQ(page(), "Quorle.htm");
-    command("Forward");
-    EXPECT_EQ(page(), "more.htm");
-    command("Contents");
-    EXPECT_EQ(page(), "Quorle.htm");
-    command("Back");
-    EXPECT_EQ(page(), "more.htm");
-    command("Exit");
+    EXPECT_EQ(after("Back"), "Quorle.htm");
+    EXPECT_EQ(after("Forward"), "more.htm");
+    EXPECT_EQ(after("Contents"), "Quorle.htm");
+    EXPECT_EQ(after("Back"), "more.htm");
+    after("Exit");
     EXPECT_FALSE(isShown("HelpBrowser"));
     press("HelpButton");
-    EXPECT_EQ(page(), "Quorle.htm");
-    command("Back");
-    EXPECT_EQ(page(), "more.htm");
+    EXPECT_EQ(viewer().source().fileName(), "Quorle.htm");
+    EXPECT_EQ(after("Back"), "more.htm");
     closeByTitleBar("HelpBrowser");
     press("HelpButton");
-    command("Back");
-    EXPECT_EQ(page(), "Quorle.htm");
+    EXPECT_EQ(after("Back"), "Quorle.htm");
 }
 
 TEST_F(Help, AMissingPageIsToldInItsPlaceAlone) {
-    write("Quorle.htm", "");
+    closeByTitleBar("HelpBrowser");
+    std::filesystem::remove(folder_ / "program/Quorle.htm");
     const auto previous =
         qInstallMessageHandler([](QtMsgType, const QMessageLogContext&, const QString& text) {
             Messages += text.startsWith("This plugin does not support") ? 0 : 1;

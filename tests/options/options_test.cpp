@@ -3,9 +3,7 @@
 #include <QCheckBox>
 #include <QComboBox>
 #include <QLineEdit>
-#include <QTest>
 
-#include "dictionary/dictionary.h"
 #include "support/program_fixture.h"
 
 namespace {
@@ -19,133 +17,111 @@ const char* const Board = "CATSBONEWILDHEFY";
 
 class OptionsTest : public ProgramFixture {
   protected:
-    OptionsTest() { makeDictionary({"cat", "cats", "elephants"}); }
-
-    void open() {
+    OptionsTest() {
+        makeDictionary({"cat", "cats", "elephants"});
+        store("MinWordSize", "2");
         launch();
         press("Options");
     }
-
     QComboBox& box(const char* name) { return *qobject_cast<QComboBox*>(control(name)); }
+    void toggleSounds() { qobject_cast<QCheckBox*>(control("SoundsOption"))->click(); }
 
-    std::string shown(const char* name) { return box(name).currentText().toStdString(); }
-
-    QCheckBox& sounds() { return *qobject_cast<QCheckBox*>(control("SoundsOption")); }
-
-    void expectQuestion(const char* question, QMessageBox::StandardButton answer) {
-        boxes_.expect("Quorle", question, QMessageBox::Yes | QMessageBox::No, answer);
+    /// Chooses where a text is given, and presses a button.
+    void answer(const char* button, const char* time, const char* minimum, const char* maximum) {
+        box("TimeCombo").setCurrentText(time);
+        if (*minimum != 0) box("MinWordSizeCombo").setCurrentText(minimum);
+        if (*maximum != 0) box("WordSizeCombo").setCurrentText(maximum);
+        press(button);
     }
-
-    void typeTime(const std::string& text) {
-        box("TimeCombo").setFocus();
-        box("TimeCombo").lineEdit()->selectAll();
-        type(text);
+    std::string choices() {
+        std::string all;
+        for (const char* name : {"TimeCombo", "MinWordSizeCombo", "WordSizeCombo"}) {
+            all += box(name).currentText().toStdString() + " ";
+        }
+        return all + std::to_string(control("SoundsOption")->property("checked").toBool());
+    }
+    static std::string settings() {
+        return std::to_string(State.TimeLimit) + " " + std::to_string(cMinWordSize()) + " " +
+               std::to_string(cMaxWordSize()) + " " + std::to_string(State.Sounds);
+    }
+    static std::string allStored() {
+        return stored("TimeLimit") + " " + stored("MinWordSize") + " " + stored("MaxWordSize") +
+               " " + stored("Sounds");
     }
 };
 
-TEST_F(OptionsTest, OKAppliesAndSavesAllFour) {
-    open();
-    typeTime("4:00");
-    box("MinWordSizeCombo").setCurrentText("16 letters");
-    sounds().click();
-    press("OKButton");
+TEST_F(OptionsTest, CancelAppliesNothingAndKeepsTheChoicesForOK) {
+    answer("CancelButton", "0:15", "16 letters", "");
+    press("Options");
+    box("WordSizeCombo").setCurrentText("8 letters");
+    toggleSounds();
+    closeByTitleBar("OptionsDialog");
+    EXPECT_EQ(settings(), "180 2 16 -1");
+    EXPECT_EQ(allStored(), " 2  ");
+    press("Options");
+    EXPECT_EQ(choices(), "0:15 16 letters 8 letters 0");
+    answer("OKButton", "4:00", "", "16 letters");
     EXPECT_FALSE(isShown("OptionsDialog"));
-    EXPECT_EQ(stored("TimeLimit"), "240");
-    EXPECT_EQ(stored("MinWordSize"), "16");
-    EXPECT_EQ(stored("MaxWordSize"), "16");
-    EXPECT_EQ(stored("Sounds"), "0");
+    EXPECT_EQ(settings(), "240 16 16 0");
+    EXPECT_EQ(allStored(), "240 16 16 0");
     start(Board);
     EXPECT_EQ(text("TimeLeft"), "4:00");
 }
 
-TEST_F(OptionsTest, CancelAppliesNothingAndKeepsTheChoices) {
-    open();
-    box("TimeCombo").setCurrentText("0:15");
-    box("MinWordSizeCombo").setCurrentText("5 letters");
-    press("CancelButton");
-    press("Options");
-    box("WordSizeCombo").setCurrentText("8 letters");
-    sounds().click();
-    closeByTitleBar("OptionsDialog");
-    EXPECT_EQ(State.TimeLimit, 180);
-    EXPECT_EQ(cMaxWordSize(), 16);
-    EXPECT_EQ(stored("TimeLimit"), "");
-    press("Options");
-    EXPECT_EQ(shown("TimeCombo"), "0:15");
-    EXPECT_EQ(shown("MinWordSizeCombo"), "5 letters");
-    EXPECT_EQ(shown("WordSizeCombo"), "8 letters");
-    EXPECT_FALSE(sounds().isChecked());
-}
-
 TEST_F(OptionsTest, AnotherMinimumStopsTheGameOnlyWhenThePlayerAgrees) {
-    open();
     start(Board);
-    box("TimeCombo").setCurrentText("5:00");
-    box("MinWordSizeCombo").setCurrentText("4 letters");
-    box("WordSizeCombo").setCurrentText("8 letters");
-    expectQuestion(StopQuestion, QMessageBox::No);
-    press("OKButton");
-    EXPECT_EQ(cMinWordSize(), 3);
-    EXPECT_EQ(cMaxWordSize(), 16);
-    EXPECT_EQ(State.TimeLimit, 300);
+    boxes_.expectQuestion(StopQuestion, QMessageBox::No);
+    answer("OKButton", "5:00", "4 letters", "8 letters");
+    EXPECT_EQ(settings(), "300 2 16 -1");
     EXPECT_EQ(State.TimeRemaining, 180);
     press("Options");
-    EXPECT_EQ(shown("MinWordSizeCombo"), "3 letters");
-    press("OKButton");
-    press("Options");
-    box("MinWordSizeCombo").setCurrentText("4 letters");
-    expectQuestion(StopQuestion, QMessageBox::Yes);
-    press("OKButton");
-    EXPECT_EQ(cMinWordSize(), 4);
+    boxes_.expectQuestion(StopQuestion, QMessageBox::Yes);
+    answer("OKButton", "5:00", "4 letters", "");
+    EXPECT_EQ(settings(), "300 4 16 -1");
     EXPECT_FALSE(isShown("Results"));
     bringToFront("Main");
     tick();
     EXPECT_TRUE(isShown("Results"));
+    press("Options");
+    press("OKButton");  // the same minimum: nothing is asked
 }
 
 TEST_F(OptionsTest, ASmallerMaximumRemovesWordsOnlyWhenThePlayerAgrees) {
-    open();
-    sounds().click();
-    box("WordSizeCombo").setCurrentText("8 letters");
-    expectQuestion(RemoveQuestion, QMessageBox::No);
-    press("OKButton");
-    EXPECT_EQ(cMaxWordSize(), 16);
-    EXPECT_TRUE(Dictionary::IsInDictionary("elephants"));
-    EXPECT_TRUE(State.Sounds);
+    toggleSounds();
+    boxes_.expectQuestion(RemoveQuestion, QMessageBox::No);
+    answer("OKButton", "3:00", "", "8 letters");
+    EXPECT_EQ(settings(), "180 2 16 -1");
+    EXPECT_EQ(cNumberOfWords(), 3);
     EXPECT_FALSE(State.DictionaryChanged);
     press("Options");
-    box("WordSizeCombo").setCurrentText("8 letters");
-    expectQuestion(RemoveQuestion, QMessageBox::Yes);
-    press("OKButton");
+    boxes_.expectQuestion(RemoveQuestion, QMessageBox::Yes);
+    answer("OKButton", "3:00", "", "8 letters");
     EXPECT_EQ(stored("MaxWordSize"), "8");
-    EXPECT_FALSE(Dictionary::IsInDictionary("elephants"));
+    EXPECT_EQ(cNumberOfWords(), 2);
     EXPECT_TRUE(State.DictionaryChanged);
     press("Options");
-    box("WordSizeCombo").setCurrentText("9 letters");
-    press("OKButton");
+    answer("OKButton", "3:00", "", "9 letters");
     EXPECT_EQ(cMaxWordSize(), 9);
 }
 
 TEST_F(OptionsTest, ABoxWithoutASelectedEntryLeavesItsSettingAlone) {
-    store("MinWordSize", "2");
-    open();
     EXPECT_EQ(box("MinWordSizeCombo").currentIndex(), -1);
-    start(Board);
     bringToFront("OptionsDialog");
-    typeTime("4:000");
-    key(Qt::Key_Return);
-    EXPECT_EQ(shown("TimeCombo"), "4:000");
-    EXPECT_EQ(box("TimeCombo").currentIndex(), -1);
-    EXPECT_EQ(box("TimeCombo").count(), 7);
-    sounds().click();
-    press("OKButton");
-    EXPECT_EQ(State.TimeLimit, 180);
-    EXPECT_EQ(cMinWordSize(), 2);
-    EXPECT_FALSE(State.Sounds);
+    for (const char* time : {"4:000", "4:00"}) {  // no entry, and one
+        box("TimeCombo").setFocus();
+        box("TimeCombo").lineEdit()->selectAll();
+        type(time);
+        key(Qt::Key_Return);
+        EXPECT_EQ(box("TimeCombo").currentText().toStdString(), time);
+        EXPECT_EQ(box("TimeCombo").count(), 7);
+        press("OKButton");
+        EXPECT_EQ(settings(), time[4] == '0' ? "180 2 16 -1" : "240 2 16 -1");
+        press("Options");
+        bringToFront("OptionsDialog");
+    }
 }
 
 TEST_F(OptionsTest, KeysWalkTheControlsAndPressNoButton) {
-    open();
     for (const char* name : {"OKButton", "CancelButton", "TimeCombo", "WordSizeCombo",
                              "SoundsOption", "MinWordSizeCombo"}) {
         EXPECT_TRUE(control(name)->hasFocus()) << name;

@@ -19,17 +19,10 @@ class Dialogs : public PlayedBoard {
             QTest::keyClick(edit, Qt::Key_Return);
         });
     }
-    void expectReplaceQuestion(const std::string& name, QMessageBox::StandardButton answer) {
-        boxes_.expect("Quorle", name + " already exists. Do you want to replace it?",
-                      QMessageBox::Yes | QMessageBox::No, answer);
-    }
 };
 
 TEST_F(Dialogs, EscapeIsNoAndTheFrontComesBack) {
-    const auto escape = [](QWidget& box) { QTest::keyClick(&box, Qt::Key_Escape); };
-    boxes_.expectModal(escape);
-    EXPECT_FALSE(Platform::AskYesNo("Sure?", "Quorle"));
-    boxes_.expectModal([](QWidget& box) { box.close(); });
+    boxes_.expectModal([](QWidget& box) { QTest::keyClick(&box, Qt::Key_Escape); });
     EXPECT_FALSE(Platform::AskYesNo("Sure?", "Quorle"));
     boxes_.expectModal([](QWidget& box) {
         EXPECT_EQ(box.parentWidget()->objectName(), "Main");
@@ -49,10 +42,10 @@ TEST_F(Dialogs, ASavedFileGetsASuffixAndIsReplacedOnlyWhenAllowed) {
     EXPECT_EQ(Platform::ChooseFileToSave(folder), folder + "/words.txt");
     folder_.write("words.txt", "cat\n");
     expectNameTyped("words");
-    expectReplaceQuestion("words.txt", QMessageBox::No);
+    boxes_.expectQuestion("words.txt already exists. Do you want to replace it?", QMessageBox::No);
     EXPECT_EQ(Platform::ChooseFileToSave(folder), "");
     expectNameTyped("words");
-    expectReplaceQuestion("words.txt", QMessageBox::Yes);
+    boxes_.expectQuestion("words.txt already exists. Do you want to replace it?", QMessageBox::Yes);
     EXPECT_EQ(Platform::ChooseFileToSave(folder), folder + "/words.txt");
     expectNameTyped("words.list");
     EXPECT_EQ(Platform::ChooseFileToSave(folder), folder + "/words.list");

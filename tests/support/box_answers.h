@@ -17,11 +17,20 @@ class BoxAnswers {
                 QMessageBox::StandardButtons buttons, QMessageBox::StandardButton answer,
                 const std::function<void()>& whileUp = {});
 
+    /// The same for a message of the program, and for one of its questions.
+    void expectMessage(const std::string& text, const std::function<void()>& whileUp = {}) {
+        expect("Quorle", text, QMessageBox::Ok, QMessageBox::Ok, whileUp);
+    }
+    void expectQuestion(const std::string& text, QMessageBox::StandardButton answer,
+                        const std::string& title = "Quorle") {
+        expect(title, text, QMessageBox::Yes | QMessageBox::No, answer);
+    }
+
     /// The next modal window is handled by `act`, which has to close it.
     void expectModal(const std::function<void(QWidget&)>& act);
 
-    /// Takes any modal window as it comes, closed as by Escape.
-    void dismissAll(bool any) { dismissAll_ = any; }
+    /// Windows that are not expected are handled by `act` instead of failing the test.
+    void otherwise(const std::function<void(QWidget&)>& act) { otherwise_ = act; }
 
     /// Fails when an expected window has not come.
     void verify();
@@ -32,5 +41,6 @@ class BoxAnswers {
     QTimer timer_;
     std::deque<std::function<void(QWidget&)>> expected_;
     bool busy_ = false;
-    bool dismissAll_ = false;
+    int looksInVain_ = 0;
+    std::function<void(QWidget&)> otherwise_;
 };

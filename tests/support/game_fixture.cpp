@@ -15,11 +15,13 @@ constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
 }  // namespace
 
 void UseHome(const std::string& folder) {
-    setenv("HOME", folder.c_str(), 1);
-    setenv("XDG_CONFIG_HOME", (folder + "/config").c_str(), 1);
-    setenv("XDG_DATA_HOME", (folder + "/data").c_str(), 1);
-    setenv("XDG_CACHE_HOME", (folder + "/cache").c_str(), 1);
-    setenv("XDG_RUNTIME_DIR", folder.c_str(), 1);
+    for (const auto& [name, below] : {std::pair("HOME", ""),
+                                      {"XDG_CONFIG_HOME", "/config"},
+                                      {"XDG_DATA_HOME", "/data"},
+                                      {"XDG_CACHE_HOME", "/cache"},
+                                      {"XDG_RUNTIME_DIR", ""}}) {
+        setenv(name, (folder + below).c_str(), 1);
+    }
 }
 
 GameFixture::GameFixture() {
@@ -50,6 +52,7 @@ void GameFixture::useTestDesktop() {
 }
 
 void GameFixture::makeDictionary(const std::vector<std::string>& words, int maximum) {
+    resetProcess();
     cSetMaxWordSize(maximum);
     for (const std::string& word : words) {
         if (cDictionaryAdd(word.c_str()) != 1) ADD_FAILURE() << "no word: " << word;

@@ -1,11 +1,9 @@
 #include "support/program_fixture.h"
 
-#include <QAbstractButton>
 #include <QAbstractItemView>
+#include <QAction>
 #include <QApplication>
 #include <QClipboard>
-#include <QLabel>
-#include <QLineEdit>
 #include <QTest>
 #include <QTimer>
 #include <QTimerEvent>
@@ -19,8 +17,15 @@ namespace {
 
 // A desktop brings a window that is clicked to the front; there is none here.
 void Activate(QWidget& window) {
+    QCoreApplication::processEvents();  // what the program still does about its windows
     window.activateWindow();
     if (!QTest::qWaitForWindowActive(&window)) throw std::logic_error("not in front");
+}
+
+QWidget* Focus() {
+    const auto given = [] { return QApplication::focusWidget() != nullptr; };
+    if (!QTest::qWaitFor(given, 2000)) throw std::logic_error("nothing has the focus");
+    return QApplication::focusWidget();
 }
 
 }  // namespace
@@ -68,17 +73,25 @@ void ProgramFixture::press(const std::string& button) {
 
 void ProgramFixture::type(const std::string& text) {
     for (const char32_t letter : QString::fromStdString(text).toStdU32String()) {
-        QWidget* focus = QApplication::focusWidget();
-        if (focus == nullptr) throw std::logic_error("nothing has the focus");
-        QTest::sendKeyEvent(QTest::Click, focus, Qt::Key_unknown, QString::fromUcs4(&letter, 1),
+        QTest::sendKeyEvent(QTest::Click, Focus(), Qt::Key_unknown, QString::fromUcs4(&letter, 1),
                             Qt::NoModifier);
     }
 }
 
 void ProgramFixture::key(Qt::Key key, Qt::KeyboardModifiers modifiers) {
-    QWidget* focus = QApplication::focusWidget();
-    if (focus == nullptr) throw std::logic_error("nothing has the focus");
-    QTest::keyClick(focus, key, modifiers);
+    QTest::keyClick(Focus(), key, modifiers);
+}
+
+void ProgramFixture::enter(const Words& entered) {
+    for (const std::string& word : entered) {
+        type(word);
+        key(Qt::Key_Return);
+    }
+}
+
+void ProgramFixture::replaceAll(const std::string& text) {
+    key(Qt::Key_A, Qt::ControlModifier);
+    text.empty() ? key(Qt::Key_Delete) : paste(text);
 }
 
 void ProgramFixture::paste(const std::string& text) {
@@ -108,6 +121,12 @@ void ProgramFixture::select(const std::string& list, const std::string& word) {
     if (found.isEmpty()) throw std::logic_error(list + " has no " + word);
     shown.scrollTo(found.first());
     clickOn(*shown.viewport(), shown.visualRect(found.first()).center(), Qt::LeftButton);
+}
+
+void ProgramFixture::menu(const std::string& command) {
+    const auto slash = command.find('/');
+    const auto name = QString::fromStdString(command.substr(slash + 1));
+    control(command.substr(0, slash))->findChild<QAction*>(name)->trigger();
 }
 
 void ProgramFixture::bringToFront(const std::string& window) {
@@ -164,13 +183,20 @@ bool ProgramFixture::isShown(const std::string& window) {
 }
 
 std::string ProgramFixture::text(const std::string& name) {
-    QWidget* found = control(name);
-    if (const auto* label = qobject_cast<QLabel*>(found)) return label->text().toStdString();
-    if (const auto* box = qobject_cast<QLineEdit*>(found)) return box->text().toStdString();
-    if (const auto* button = qobject_cast<QAbstractButton*>(found)) {
-        return button->text().toStdString();
-    }
-    throw std::logic_error("no text on " + name);
+    const QVariant text = control(name)->property("text");
+    if (!text.isValid()) throw std::logic_error("no text on " + name);
+    return text.toString().toStdString();
+}
+
+std::string ProgramFixture::entry() {
+    std::string all = typed() + " [";
+    for (const int tile : litTiles()) all += std::to_string(tile) + " ";
+    if (all.back() == ' ') all.pop_back();
+    return all + "] " + std::to_string(warnings_);
+}
+
+std::string ProgramFixture::summary() {
+    return text("WordsLabel") + "; " + text("ScoreLabel") + "; " + text("BadWordsLabel");
 }
 
 std::string ProgramFixture::letters(const std::string& tiles) {
@@ -182,23 +208,13 @@ std::string ProgramFixture::letters(const std::string& tiles) {
     return all;
 }
 
-Words ProgramFixture::words(const std::string& list) {
+Words ProgramFixture::words(const std::string& list, bool struckOnly) {
     const QAbstractItemModel& model = *view(list).model();
     Words all;
     for (int row = 0; row < model.rowCount(); ++row) {
-        all.push_back(model.index(row, 0).data().toString().toStdString());
-    }
-    return all;
-}
-
-Words ProgramFixture::struck() {
-    const QAbstractItemModel& model = *view("WordList").model();
-    Words all;
-    for (int row = 0; row < model.rowCount(); ++row) {
         const QModelIndex cell = model.index(row, 0);
-        if (cell.data(Qt::FontRole).value<QFont>().strikeOut()) {
-            all.push_back(cell.data().toString().toStdString());
-        }
+        if (struckOnly && !cell.data(Qt::FontRole).value<QFont>().strikeOut()) continue;
+        all.push_back(cell.data().toString().toStdString());
     }
     return all;
 }

@@ -25,17 +25,21 @@ class ProgramFixture : public GameFixture {
 
     /// The program ends, and starts again as a new process would.
     void relaunch();
+    static void endProgram();
 
     // What the player does.
     void start(const std::string& board);   ///< presses Start
     void press(const std::string& button);  ///< by mouse
     void type(const std::string& text);     ///< key by key
     void key(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
+    void enter(const Words& words);  ///< types each, and Return
     void paste(const std::string& text);
+    void replaceAll(const std::string& text);  ///< selects all, then pastes or deletes
     void click(int tile, Qt::MouseButton button = Qt::LeftButton);
     void clickTiles(const Tiles& tiles);
     void doubleClick(int tile);
     void select(const std::string& list, const std::string& word);  ///< by mouse
+    void menu(const std::string& command);                          ///< "HelpBrowser/Back"
     void bringToFront(const std::string& window);
     void closeByTitleBar(const std::string& window);
     void tick(int times = 1);  ///< the clock fires, if it runs
@@ -49,14 +53,17 @@ class ProgramFixture : public GameFixture {
     Tiles litTiles() { return lit("Cube"); }
     Tiles litResults() { return lit("ResultCubes"); }
     std::string letters(const std::string& tiles = "Cube");  ///< blank tiles: "."
-    Words words(const std::string& list = "WordList");
-    Words struck();  ///< words struck through
-    int warnings() { return warnings_; }
+    std::string entry();  ///< the word typed, the tiles lit, the warnings: "cat [0 1 2] 0"
+    std::string typing(const std::string& text) { return type(text), entry(); }
+    std::string clicking(const Tiles& tiles) { return clickTiles(tiles), entry(); }
+    std::string clearing() { return press("Clear"), entry(); }
+    std::string summary();  ///< the lines under the results
+    Words words(const std::string& list = "WordList", bool struckOnly = false);
+    Words struck() { return words("WordList", true); }
 
     BoxAnswers boxes_;
 
   private:
-    static void endProgram();
     static void clickOn(const QWidget& widget, const QPoint& place, Qt::MouseButton button);
     QWidget* find(const std::string& name);
     QTimer& clock();

@@ -5,10 +5,17 @@
 #include <cstdlib>
 #include <iostream>
 
+namespace {
+
+unsigned FromEnvironment(const char* name, unsigned otherwise) {
+    const char* given = std::getenv(name);
+    return given == nullptr ? otherwise : static_cast<unsigned>(std::strtoul(given, nullptr, 10));
+}
+
+}  // namespace
+
 RandomPlayer::RandomPlayer() {
-    const char* given = std::getenv("QUORLE_SEED");
-    const auto seed = given == nullptr ? std::random_device()()
-                                       : static_cast<unsigned>(std::strtoul(given, nullptr, 10));
+    const unsigned seed = FromEnvironment("QUORLE_SEED", std::random_device()());
     std::cout << "QUORLE_SEED=" << seed << std::endl;
     random_.seed(seed);
 }
@@ -20,13 +27,16 @@ void RandomPlayer::can(const std::string& name, int weight, const std::function<
 void RandomPlayer::play(int actions) {
     constexpr std::size_t Remembered = 300;
     std::string done;
-    for (int i = 0; i < actions; ++i) {
+    for (unsigned i = FromEnvironment("QUORLE_ACTIONS", static_cast<unsigned>(actions)); i > 0;
+         --i) {
         const Action& action = oneOf(actions_);
         done += " " + action.name;
         if (done.size() > Remembered) done.erase(0, done.size() - Remembered);
-        SCOPED_TRACE("action " + std::to_string(i) + " of ..." + done);
-        action.act();
-        for (const auto& check : checks_) check();
+        SCOPED_TRACE(std::to_string(i) + " actions before the end, after ..." + done);
+        EXPECT_NO_THROW({
+            action.act();
+            for (const auto& check : checks_) check();
+        });
         if (testing::Test::HasFailure()) return;
     }
 }

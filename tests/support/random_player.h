@@ -1,6 +1,7 @@
 #pragma once
 // Plays at random, and looks after each action whether all is as it must be. A
-// run can be repeated: its seed is printed, and taken from QUORLE_SEED where set.
+// run can be repeated and made longer: its seed is printed, and taken from
+// QUORLE_SEED where set; QUORLE_ACTIONS is the number of actions.
 #include <functional>
 #include <random>
 #include <string>

@@ -1,0 +1,136 @@
+// How files are written: text files, settings, and what is kept of a damaged dictionary.
+#include <fcntl.h>
+#include <gtest/gtest.h>
+#include <sys/file.h>
+#include <sys/stat.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <algorithm>
+
+#include "quorle/word_engine.h"
+#include "temp_folder.h"
+
+namespace {
+
+using Names = std::set<std::string>;
+
+class Files : public testing::Test {
+  protected:
+    Files() {
+        cDictionaryClear();
+        cDictionaryAdd("cat");
+        setenv("XDG_CONFIG_HOME", folder_.path().c_str(), 1);
+    }
+    bool save(const std::string& name) const {
+        return cWriteTextFile((folder_ / name).c_str()) == 1;
+    }
+    static bool set(const std::string& key, const std::string& name, const std::string& value) {
+        const auto length = static_cast<std::int32_t>(value.size());
+        return cSetRegValue(key.c_str(), name.c_str(), value.data(), length) == 1;
+    }
+    static std::string get(const std::string& key, const std::string& name) {
+        std::string value(255, '?');
+        std::int32_t length = 255;
+        if (cGetRegValue(key.c_str(), name.c_str(), value.data(), &length) == 0) return "absent";
+        return value.substr(0, static_cast<std::size_t>(length));
+    }
+    TempFolder folder_;
+};
+
+TEST_F(Files, AreWrittenThroughDanglingLinksButOnlyWhereAFileMayBe) {
+    std::filesystem::create_directory(folder_ / "sub");
+    std::filesystem::create_symlink("sub/second", folder_ / "first");
+    std::filesystem::create_symlink("../target", folder_ / "sub/second");
+    const mode_t mask = umask(0027);
+    EXPECT_TRUE(save("first"));
+    umask(mask);
+    EXPECT_EQ(folder_.read("target"), "cat\n");
+    EXPECT_EQ(static_cast<int>(std::filesystem::status(folder_ / "target").permissions()), 0640);
+    ASSERT_EQ(mkfifo((folder_ / "pipe").c_str(), 0600), 0);
+    std::filesystem::create_symlink("loop", folder_ / "loop");
+    std::filesystem::create_symlink("/dev/null", folder_ / "device");
+    folder_.write(".quorle-save", "no temporary file of ours");
+    for (const char* name :
+         {"sub", "pipe", "loop", "device", "sub/", "sub/..", "", "missing/file", ".quorle-save"}) {
+        EXPECT_FALSE(save(name)) << name;
+    }
+    EXPECT_EQ(folder_.names(),
+              (Names{"first", "sub", "target", "pipe", "loop", "device", ".quorle-save"}));
+}
+
+TEST_F(Files, WaitForAnotherSaverAndGiveUp) {
+    folder_.write("file", "old");
+    const int other = open(folder_.path().c_str(), O_RDONLY | O_DIRECTORY);
+    ASSERT_EQ(flock(other, LOCK_EX), 0);
+    EXPECT_FALSE(save("file"));
+    EXPECT_EQ(folder_.read("file"), "old");
+    if (fork() == 0) {
+        usleep(100'000);
+        _exit(0);  // the lock goes with the last holder of the open folder
+    }
+    close(other);
+    EXPECT_TRUE(save("file"));
+    wait(nullptr);
+}
+
+TEST_F(Files, AreKeptOnceWhenADamagedOneIsReplaced) {
+    folder_.write("Dictionary.dat", "broken");
+    folder_.write("Dictionary.dat.damaged", "broken last year");
+    EXPECT_EQ(cReadBinaryDictionary((folder_ / "Dictionary.dat").c_str()), 0);
+    std::filesystem::create_symlink(folder_.path(), folder_ / "link");
+    for (const char* name : {"good", "link/Dictionary.dat", "Dictionary.dat"}) {
+        EXPECT_TRUE(save(name));
+    }
+    EXPECT_EQ(folder_.read("Dictionary.dat.damaged"), "broken last year");
+    EXPECT_EQ(folder_.read("Dictionary.dat.damaged.2"), "broken");
+    EXPECT_EQ(folder_.names(), (Names{"good", "link", "Dictionary.dat", "Dictionary.dat.damaged",
+                                      "Dictionary.dat.damaged.2"}));
+}
+
+TEST_F(Files, OfSettingsKeepEveryValueAndForeignLine) {
+    const std::string longest(255, 'x');
+    const std::pair<std::string, std::string> names[] = {
+        {"a", "b=c"}, {"a=b", "c"}, {"a\\", "b"}, {"a", "\\b"},       {"[a]", "#b"},
+        {"a ", "b"},  {"A", "b"},   {"ä", "ü"},   {longest, longest}, {"S\\Default", "x"}};
+    folder_.write("quorle/settings", "");
+    for (const auto& [key, name] : names) {
+        EXPECT_EQ(get(key, name), "absent");
+        EXPECT_TRUE(set(key, name, key.substr(0, 100) + name.substr(0, 100)));
+    }
+    for (const auto& [key, name] : names) {
+        EXPECT_EQ(get(key, name), key.substr(0, 100) + name.substr(0, 100));
+    }
+    for (const std::string& bad : {longest + "x", std::string("a\tb"), std::string("\n")}) {
+        EXPECT_FALSE(set(bad, "name", "value") || set("key", bad, "value") || set("k", "n", bad));
+    }
+    folder_.write("quorle/settings", "# mine\n\nk\tn\to\tmany\nk\tn\t5\r\nk\tn\tx\nk\tna");
+    EXPECT_EQ(get("k", "n"), "x");
+    EXPECT_TRUE(set("k", "n", ""));
+    EXPECT_EQ(folder_.read("quorle/settings"),
+              "# mine\n\nk\tn\to\tmany\nk\tn\t5\r\nk\tn\t\nk\tna\n");
+    EXPECT_EQ(get("k", "n"), "");
+    std::filesystem::remove_all(folder_ / "quorle");
+    std::filesystem::create_directories(folder_ / "quorle/settings");
+    EXPECT_FALSE(set("key", "name", "value"));  // unreadable is not empty
+    setenv("XDG_CONFIG_HOME", "relative", 1);
+    setenv("HOME", (folder_ / "home").c_str(), 1);
+    EXPECT_TRUE(set("key", "name", "at home"));
+    EXPECT_EQ(folder_.read("home/.config/quorle/settings"), "key\tname\tat home\n");
+}
+
+TEST_F(Files, OfSettingsHoldTheValuesOfProgramsAtOnce) {
+    for (const char program : {'a', 'b', 'c', 'd'}) {
+        if (fork() != 0) continue;
+        for (std::string name(1, program); name.size() <= 25; name += 'x') {
+            while (!set("key", name, "value")) continue;  // the lock was kept for too long
+        }
+        _exit(0);
+    }
+    int status = 0;
+    while (wait(&status) > 0) EXPECT_EQ(status, 0);
+    const std::string all = folder_.read("quorle/settings");
+    EXPECT_EQ(std::count(all.begin(), all.end(), '\n'), 4 * 25);
+}
+
+}  // namespace
