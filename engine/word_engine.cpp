@@ -118,13 +118,9 @@ int32_t cWriteBinaryDictionary(const char* path) {
 int32_t cDictionaryCheck(char* word, int32_t* found, int32_t* other) {
     if (found == nullptr || other == nullptr) return 0;
     *found = *other = 0;
-    if (word == nullptr) return 0;
-    const std::string_view letters = Beginning(word);
+    if (word == nullptr || word[0] == 0) return 0;
     GraphPlace place{};
-    if (letters.empty() || letters.size() > LongestWord || !IsLetters(letters) ||
-        !TheDictionary.words.find(letters, place)) {
-        return 0;
-    }
+    if (!TheDictionary.words.find(word, place)) return 0;
     *other = 1;
     *found = place.isWord ? 1 : 0;
     return *found;

@@ -1,5 +1,7 @@
 #include "word_graph.h"
 
+#include <algorithm>
+#include <array>
 #include <utility>
 
 #include "graph_edit.h"
@@ -8,13 +10,13 @@ namespace {
 
 constexpr std::uint32_t EmptyNode[1] = {0};
 
-/// Goes on from `place` along the letters as far as words do; false when that is not all the way.
-inline bool Follow(const std::uint32_t* nodes, std::string_view letters, GraphPlace& place) {
-    for (const char letter : letters) {
+/// Goes on from `place` along the text as far as words do; false when that is not to its end.
+inline bool Follow(const std::uint32_t* nodes, const char* text, GraphPlace& place) {
+    for (; *text != 0; ++text) {
+        const std::uint32_t letter = static_cast<std::uint32_t>(*text) - 'a';
         const std::uint32_t mask = nodes[place.node];
-        const std::uint32_t bit = LetterBit(letter);
-        if ((mask & bit) == 0) return false;
-        const std::uint32_t* link = nodes + place.node + LinkOffset(mask, bit);
+        if (letter >= Letters || (mask >> letter & 1) == 0) return false;
+        const std::uint32_t* link = nodes + place.node + LinkOffset(mask, 1U << letter);
         place.node = ChildOf(link[0]);
         place.isWord = (link[0] & WordEnds) != 0;
         place.firstWord += link[1] + (place.isWord ? 1 : 0);
@@ -25,9 +27,9 @@ inline bool Follow(const std::uint32_t* nodes, std::string_view letters, GraphPl
 #if defined(__x86_64__)
 // Bits are counted at every letter, and not every processor has an instruction for it.
 [[gnu::target("popcnt"), gnu::flatten]] bool FollowByInstruction(const std::uint32_t* nodes,
-                                                                 std::string_view letters,
+                                                                 const char* text,
                                                                  GraphPlace& place) {
-    return Follow(nodes, letters, place);
+    return Follow(nodes, text, place);
 }
 #endif
 
@@ -61,13 +63,19 @@ const std::uint32_t* WordGraph::nodes() const {
     return store_ ? store_->words() : EmptyNode;
 }
 
-bool WordGraph::find(std::string_view letters, GraphPlace& place) const {
+bool WordGraph::find(const char* text, GraphPlace& place) const {
     place = {root_, 0, false};
 #if defined(__x86_64__)
     static const bool CanCount = __builtin_cpu_supports("popcnt") != 0;
-    if (CanCount) return FollowByInstruction(nodes(), letters, place);
+    if (CanCount) return FollowByInstruction(nodes(), text, place);
 #endif
-    return Follow(nodes(), letters, place);
+    return Follow(nodes(), text, place);
+}
+
+bool WordGraph::find(std::string_view letters, GraphPlace& place) const {
+    std::array<char, LongestWord + 1> text{};
+    std::copy(letters.begin(), letters.end(), text.begin());
+    return find(text.data(), place);
 }
 
 bool WordGraph::contains(std::string_view word) const {

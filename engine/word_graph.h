@@ -56,7 +56,9 @@ class WordGraph {
     /// Above the index of every node.
     std::size_t nodesEnd() const { return store_ ? store_->size() : 1; }
 
-    /// Follows `letters` from the root; false when no word begins with them.
+    /// Follows a text, which may hold anything, from the root; false when no word begins with it.
+    bool find(const char* text, GraphPlace& place) const;
+    /// The same for a word or a prefix.
     bool find(std::string_view letters, GraphPlace& place) const;
 
   private:
