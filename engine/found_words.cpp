@@ -33,19 +33,3 @@ void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room) {
         words.swap(room);
     }
 }
-
-std::size_t Spell(const FoundWord& word, const Board& board, char* letters) {
-    const std::size_t size = word.spelling % EndsInQ;
-    std::size_t left = size;
-    std::uint64_t path = word.path;
-    if (word.spelling >= EndsInQ) {
-        letters[--left] = 'q';
-        path >>= 4;
-    }
-    for (; left > 0; path >>= 4) {
-        const char letter = board[path % Cubes];
-        if (letter == 'q') letters[--left] = 'u';
-        letters[--left] = letter;
-    }
-    return size;
-}

@@ -21,4 +21,20 @@ inline constexpr std::uint32_t EndsInQ = 0x100;
 void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room);
 
 /// Writes the word's letters, at most 16, and returns how many.
-std::size_t Spell(const FoundWord& word, const Board& board, char* letters);
+inline std::size_t Spell(const FoundWord& word, const Board& board, char* letters) {
+    const std::size_t size = word.spelling % EndsInQ;
+    char* letter = letters + size;
+    std::uint64_t path = word.path;
+    if (word.spelling != size) [[unlikely]] {
+        *--letter = 'q';
+        path >>= 4;
+    }
+    while (letter != letters) {
+        const char face = board[path % Cubes];
+        path >>= 4;
+        if (face == 'q') [[unlikely]]
+            *--letter = 'u';
+        *--letter = face;
+    }
+    return size;
+}
