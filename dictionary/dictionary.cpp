@@ -2,7 +2,19 @@
 
 #include <quorle/word_engine.h>
 
+#include <future>
+
 #include "platform/platform.h"
+
+namespace {
+
+std::future<void> Ahead;
+
+void LoadFile() {
+    cReadBinaryDictionary(Dictionary::FilePath().c_str());
+}
+
+}  // namespace
 
 namespace Dictionary {
 
@@ -10,9 +22,17 @@ std::string FilePath() {
     return Platform::ProgramFolder() + "/Dictionary.dat";
 }
 
+void LoadAhead() {
+    Ahead = std::async(std::launch::async, LoadFile);
+}
+
 void LoadDictionary() {
     State.LetterBase = 'a';
-    cReadBinaryDictionary(FilePath().c_str());
+    if (Ahead.valid()) {
+        Ahead.get();
+    } else {
+        LoadFile();
+    }
     State.DictionaryChanged = False;
 }
 

@@ -5,6 +5,7 @@
 #include <chrono>
 
 #include "board/tile_picture.h"
+#include "dictionary/dictionary.h"
 #include "game/main_window.h"
 #include "game/windows.h"
 #include "platform/legible_style.h"
@@ -34,6 +35,9 @@ void FinishWindow() {
 }  // namespace
 
 int main(int argc, char** argv) {
+    Platform::UseDesktop();
+    // The toolkit's own start takes long enough for it.
+    Dictionary::LoadAhead();
     QApplication application(argc, argv);
     QApplication::setStyle(new LegibleStyle);
     // The texts are English and have their places; mirrored, "=>" would point back.
@@ -42,7 +46,6 @@ int main(int argc, char** argv) {
     QApplication::setDesktopFileName("quorle");
     // Hiding the last window shown must not end the program; closing Main does.
     QApplication::setQuitOnLastWindowClosed(false);
-    Platform::UseDesktop();
     Main& window = Windows::Shared<Main>();
     CentreOnScreen(window);
     FollowSessionEnd([&window] { window.close(); });
