@@ -87,9 +87,10 @@ void ListWords() {
 void ShowEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     if (editor.isVisible()) return;
-    QWidget* inFront = QApplication::activeWindow();
-    // Nor may it cover a box that has to be answered first.
-    const bool behind = State.TimeRemaining != 0 || QApplication::activeModalWidget() != nullptr;
+    // A box that has just been opened is not yet the active window.
+    QWidget* box = QApplication::activeModalWidget();
+    QWidget* inFront = box != nullptr ? box : QApplication::activeWindow();
+    const bool behind = box != nullptr || State.TimeRemaining != 0;
     editor.setAttribute(Qt::WA_ShowWithoutActivating, behind);
     editor.show();
     if (behind && inFront != nullptr) inFront->activateWindow();
