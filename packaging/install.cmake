@@ -12,10 +12,10 @@ set(sources ${CMAKE_CURRENT_LIST_DIR})
 set(made ${PROJECT_BINARY_DIR}/packaging)
 
 file(RELATIVE_PATH library_from_games /prefix/${games} /prefix/${library})
-# The build's run path must not be the shorter one: it would be filled up with empty entries, which
-# stand for the current folder.
-set_target_properties(quorle PROPERTIES
-  INSTALL_RPATH "$ORIGIN/${library_from_games}" BUILD_RPATH "$ORIGIN/${library_from_games}")
+# One run path for the installed and the built program: one that is changed on installing is filled
+# up with empty entries before, which stand for the current folder.
+set_target_properties(quorle PROPERTIES BUILD_WITH_INSTALL_RPATH ON
+  INSTALL_RPATH "$ORIGIN/${library_from_games};$ORIGIN/../lib")
 add_dependencies(quorle program_folder)
 
 if(QUORLE_BASE_ADDRESS)
