@@ -1,5 +1,6 @@
 #include <QApplication>
 #include <QIcon>
+#include <QPixmapCache>
 #include <QScreen>
 #include <QTimer>
 #include <chrono>
@@ -23,6 +24,8 @@ void CentreOnScreen(QWidget& window) {
 // by a tenth, and the first lit tile is not wanted before the first game.
 constexpr std::chrono::milliseconds AfterFirstPaint{100};
 
+constexpr int PictureCache = 1024;  // KiB
+
 void FinishWindow() {
     QIcon icon;
     for (const char* size : {"48", "128"}) icon.addFile(QString(":/quorle-%1.png").arg(size));
@@ -36,6 +39,8 @@ void FinishWindow() {
 
 int main(int argc, char** argv) {
     Platform::UseDesktop();
+    // Every window made anew has its pictures cached once more; ten times this is Qt's own bound.
+    QPixmapCache::setCacheLimit(PictureCache);
     // The toolkit's own start takes long enough for it.
     Dictionary::LoadAhead();
     QApplication application(argc, argv);
