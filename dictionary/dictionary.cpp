@@ -2,19 +2,7 @@
 
 #include <quorle/word_engine.h>
 
-#include <future>
-
 #include "platform/platform.h"
-
-namespace {
-
-std::future<void> Ahead;
-
-void LoadFile() {
-    cReadBinaryDictionary(Dictionary::FilePath().c_str());
-}
-
-}  // namespace
 
 namespace Dictionary {
 
@@ -22,17 +10,9 @@ std::string FilePath() {
     return Platform::ProgramFolder() + "/Dictionary.dat";
 }
 
-void LoadAhead() {
-    Ahead = std::async(std::launch::async, LoadFile);
-}
-
 void LoadDictionary() {
     State.LetterBase = 'a';
-    if (Ahead.valid()) {
-        Ahead.get();
-    } else {
-        LoadFile();
-    }
+    cReadBinaryDictionary(FilePath().c_str());
     State.DictionaryChanged = False;
 }
 

@@ -9,11 +9,7 @@ namespace Dictionary {
 /// The path of Dictionary.dat.
 std::string FilePath();
 
-/// Begins to load Dictionary.dat beside work that does not call the engine.
-void LoadAhead();
-
-/// Loads Dictionary.dat, or waits until that has been done ahead; where it fails, the engine's
-/// dictionary stays empty.
+/// Loads Dictionary.dat; where that fails, the engine's dictionary stays empty.
 void LoadDictionary();
 
 /// Saves Dictionary.dat.

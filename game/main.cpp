@@ -6,7 +6,6 @@
 #include <chrono>
 
 #include "board/tile_picture.h"
-#include "dictionary/dictionary.h"
 #include "game/main_window.h"
 #include "game/windows.h"
 #include "platform/legible_style.h"
@@ -41,10 +40,9 @@ int main(int argc, char** argv) {
     Platform::UseDesktop();
     // Every window made anew has its pictures cached once more; ten times this is Qt's own bound.
     QPixmapCache::setCacheLimit(PictureCache);
-    // The toolkit's own start takes long enough for it.
-    Dictionary::LoadAhead();
-    QApplication application(argc, argv);
+    // Before there is an application: after, another style would have been made already.
     QApplication::setStyle(new LegibleStyle);
+    QApplication application(argc, argv);
     // The texts are English and have their places; mirrored, "=>" would point back.
     QApplication::setLayoutDirection(Qt::LeftToRight);
     QApplication::setApplicationName("quorle");
