@@ -1,6 +1,7 @@
 #include "graph_edit.h"
 
 #include <algorithm>
+#include <array>
 
 #include "word_graph.h"
 
@@ -8,74 +9,96 @@
 // of the same letters is given up for that one, so edits that take each other back leave nothing
 // behind, and what an edited graph needs is what it differs by.
 
+namespace {
+
+/// A node of the edited word's path, the base node of the same letters, and the edge taken.
+struct Place {
+    NodeIndex node;
+    NodeIndex base;
+    std::uint32_t bit;
+    NodeIndex edge;  // where the edge's link stands
+};
+
+}  // namespace
+
 NodeIndex GraphEdit::add(NodeIndex root, std::string_view word) {
-    return addBelow(root, store_.baseRoot(), word);
+    return edit(root, word, 1);
 }
 
 NodeIndex GraphEdit::remove(NodeIndex root, std::string_view word) {
-    return removeBelow(root, store_.baseRoot(), word);
+    return edit(root, word, ~0U);
 }
 
-NodeIndex GraphEdit::addBelow(NodeIndex node, NodeIndex base, std::string_view rest) {
-    const std::uint32_t bit = LetterBit(rest.front());
-    node = withEdge(unshared(node), bit);
-    shiftSkips(node, bit, 1);
-    std::uint32_t& link = store_.words()[node + LinkOffset(store_.words()[node], bit)];
-    if (rest.size() == 1) {
-        link |= WordEnds;
-    } else {
-        const NodeIndex child = addBelow(ChildOf(link), baseChild(base, bit), rest.substr(1));
-        link = (link & WordEnds) | child;
+NodeIndex GraphEdit::edit(NodeIndex root, std::string_view word, std::uint32_t change) {
+#if defined(__x86_64__)
+    if (HasBitCount()) return toggleByInstruction(root, word, change);
+#endif
+    return toggle(root, word, change);
+}
+
+#if defined(__x86_64__)
+[[gnu::target("popcnt"), gnu::flatten]] NodeIndex GraphEdit::toggleByInstruction(
+    NodeIndex root, std::string_view word, std::uint32_t change) {
+    return toggle(root, word, change);
+}
+#endif
+
+// Down the path nodes are copied, and the words behind it counted anew, by one more or less; up
+// again they are linked, and those left out that the graph does not need.
+NodeIndex GraphEdit::toggle(NodeIndex root, std::string_view word, std::uint32_t change) {
+    std::array<Place, LongestWord> path;
+    Place* place = path.data();
+    NodeIndex node = root;
+    NodeIndex base = store_.baseRoot();
+    for (const char letter : word) {
+        const std::uint32_t bit = LetterBit(letter);
+        node = ownWithEdge(node, bit);
+        std::uint32_t* words = store_.words();
+        const std::uint32_t edge = node + LinkOffset(words[node], bit);
+        const std::uint32_t end = node + 1 + 2 * EdgeCount(words[node]);
+        for (std::uint32_t later = edge + 2; later < end; later += 2) words[later + 1] += change;
+        *place++ = {node, base, bit, edge};
+        node = ChildOf(words[edge]);
+        base = baseChild(base, bit);
     }
-    return baseIfSame(node, base);
-}
-
-NodeIndex GraphEdit::removeBelow(NodeIndex node, NodeIndex base, std::string_view rest) {
-    const std::uint32_t bit = LetterBit(rest.front());
-    node = unshared(node);
-    shiftSkips(node, bit, ~0U);
-    std::uint32_t& link = store_.words()[node + LinkOffset(store_.words()[node], bit)];
-    if (rest.size() == 1) {
-        link &= ~WordEnds;
-    } else {
-        const NodeIndex child = removeBelow(ChildOf(link), baseChild(base, bit), rest.substr(1));
-        link = (link & WordEnds) | child;
+    store_.words()[place[-1].edge] ^= WordEnds;
+    while (place != path.data()) {
+        --place;
+        std::uint32_t& link = store_.words()[place->edge];
+        link = (link & WordEnds) | node;
+        node = link == NoNode ? withoutEdge(place->node, place->bit) : place->node;
+        node = baseIfSame(node, place->base);
     }
-    if (link == NoNode) node = withoutEdge(node, bit);
-    return baseIfSame(node, base);
+    return node;
 }
 
-// The node itself where nothing else links to it, else a copy.
-NodeIndex GraphEdit::unshared(NodeIndex node) {
-    const bool edited = store_.isEdited(node);
-    if (edited && store_.references(node) == 1) return node;
-    std::uint32_t* words = store_.words();
-    const std::uint32_t edges = EdgeCount(words[node]);
-    const NodeIndex copy = store_.allocate(edges);
-    std::copy_n(words + node, 1 + 2 * edges, words + copy);
-    if (edited) {
-        for (std::uint32_t i = 0; i < edges; ++i) store_.hold(ChildOf(words[copy + 1 + 2 * i]));
-        store_.release(node);
-    }
-    return copy;
-}
-
-// The node with an edge for the letter; a new one leads nowhere yet.
-NodeIndex GraphEdit::withEdge(NodeIndex node, std::uint32_t bit) {
+// A node that nothing else links to, with an edge for the letter; a new edge leads nowhere yet.
+NodeIndex GraphEdit::ownWithEdge(NodeIndex node, std::uint32_t bit) {
     std::uint32_t* words = store_.words();
     const std::uint32_t mask = words[node];
-    if ((mask & bit) != 0) return node;
+    const bool hasEdge = (mask & bit) != 0;
+    const bool isEdited = store_.isEdited(node);
+    const bool isShared = !isEdited || store_.references(node) > 1;
+    if (hasEdge && !isShared) return node;
     const std::uint32_t edges = EdgeCount(mask);
     const std::uint32_t offset = LinkOffset(mask, bit);
-    const bool last = offset == 1 + 2 * edges;
-    const NodeIndex grown = store_.allocate(edges + 1);
-    words[grown] = mask | bit;
-    std::copy_n(words + node + 1, offset - 1, words + grown + 1);
-    words[grown + offset] = NoNode;
-    words[grown + offset + 1] = last ? CountWords(words, node) : words[node + offset + 1];
-    std::copy_n(words + node + offset, 1 + 2 * edges - offset, words + grown + offset + 2);
-    store_.free(node, edges);
-    return grown;
+    const std::uint32_t end = 1 + 2 * edges;
+    const NodeIndex copy = store_.allocate(hasEdge ? edges : edges + 1);
+    std::uint32_t* to = words + copy;
+    *to++ = mask | bit;
+    to = std::copy_n(words + node + 1, offset - 1, to);
+    if (!hasEdge) {
+        *to++ = NoNode;
+        *to++ = offset == end ? CountWords(words, node) : words[node + offset + 1];
+    }
+    std::copy_n(words + node + offset, end - offset, to);
+    if (isEdited && isShared) {
+        for (std::uint32_t i = 1; i < end; i += 2) store_.hold(ChildOf(words[node + i]));
+        store_.release(node);
+    } else if (isEdited) {
+        store_.free(node, edges);
+    }
+    return copy;
 }
 
 // The node without the letter's edge, which leads nowhere; NoNode when it was the only one.
@@ -108,13 +131,4 @@ NodeIndex GraphEdit::baseIfSame(NodeIndex node, NodeIndex base) {
     if (!std::equal(words + node, words + node + 1 + 2 * edges, words + base)) return node;
     store_.free(node, edges);
     return base;
-}
-
-// The words of all later letters move by one.
-void GraphEdit::shiftSkips(NodeIndex node, std::uint32_t bit, std::uint32_t change) {
-    std::uint32_t* words = store_.words();
-    const std::uint32_t end = 1 + 2 * EdgeCount(words[node]);
-    for (std::uint32_t i = LinkOffset(words[node], bit) + 2; i < end; i += 2) {
-        words[node + i + 1] += change;
-    }
 }

@@ -8,8 +8,8 @@
 /// `root` and returns the new root with one reference; every other snapshot stays whole.
 class GraphEdit {
   public:
-    /// The most words that one edit appends: each node on the path copied with one edge more.
-    static constexpr std::size_t MostWords = 2 * LongestWord * (2 + 2 * (Letters + 1));
+    /// The most words that one edit appends: each node on the path, with one edge more.
+    static constexpr std::size_t MostWords = LongestWord * (2 + 2 * (Letters + 1));
 
     explicit GraphEdit(NodeStore& store) : store_(store) {}
 
@@ -19,14 +19,13 @@ class GraphEdit {
     NodeIndex remove(NodeIndex root, std::string_view word);
 
   private:
-    NodeIndex addBelow(NodeIndex node, NodeIndex base, std::string_view rest);
-    NodeIndex removeBelow(NodeIndex node, NodeIndex base, std::string_view rest);
-    NodeIndex unshared(NodeIndex node);
-    NodeIndex withEdge(NodeIndex node, std::uint32_t bit);
+    NodeIndex edit(NodeIndex root, std::string_view word, std::uint32_t change);
+    NodeIndex toggle(NodeIndex root, std::string_view word, std::uint32_t change);
+    NodeIndex toggleByInstruction(NodeIndex root, std::string_view word, std::uint32_t change);
+    NodeIndex ownWithEdge(NodeIndex node, std::uint32_t bit);
     NodeIndex withoutEdge(NodeIndex node, std::uint32_t bit);
     NodeIndex baseChild(NodeIndex base, std::uint32_t bit) const;
     NodeIndex baseIfSame(NodeIndex node, NodeIndex base);
-    void shiftSkips(NodeIndex node, std::uint32_t bit, std::uint32_t change);
 
     NodeStore& store_;
 };

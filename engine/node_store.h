@@ -31,12 +31,18 @@ inline NodeIndex ChildOf(std::uint32_t link) {
     return link & ~WordEnds;
 }
 /// Written out, because where the processor is not known to count bits the library would be called;
-/// where it is, the compiler knows this form.
+/// where it is, the compiler knows this form. Walks count at every letter: those that should be
+/// fast are compiled a second time for processors that have an instruction for it.
 inline std::uint32_t EdgeCount(std::uint32_t mask) {
     mask -= (mask >> 1) & 0x55555555;
     mask = (mask & 0x33333333) + ((mask >> 2) & 0x33333333);
     return (((mask + (mask >> 4)) & 0x0f0f0f0f) * 0x01010101) >> 24;
 }
+#if defined(__x86_64__)
+inline bool HasBitCount() {
+    return __builtin_cpu_supports("popcnt") != 0;
+}
+#endif
 /// The bit of a lower-case letter in a mask.
 inline std::uint32_t LetterBit(char letter) {
     return 1U << (letter - 'a');

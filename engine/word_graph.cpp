@@ -25,7 +25,6 @@ inline bool Follow(const std::uint32_t* nodes, const char* text, GraphPlace& pla
 }
 
 #if defined(__x86_64__)
-// Bits are counted at every letter, and not every processor has an instruction for it.
 [[gnu::target("popcnt"), gnu::flatten]] bool FollowByInstruction(const std::uint32_t* nodes,
                                                                  const char* text,
                                                                  GraphPlace& place) {
@@ -66,8 +65,7 @@ const std::uint32_t* WordGraph::nodes() const {
 bool WordGraph::find(const char* text, GraphPlace& place) const {
     place = {root_, 0, false};
 #if defined(__x86_64__)
-    static const bool CanCount = __builtin_cpu_supports("popcnt") != 0;
-    if (CanCount) return FollowByInstruction(nodes(), text, place);
+    if (HasBitCount()) return FollowByInstruction(nodes(), text, place);
 #endif
     return Follow(nodes(), text, place);
 }
