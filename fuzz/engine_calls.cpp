@@ -18,9 +18,8 @@ std::int32_t Number() {
     return At == End ? 0 : *At++;
 }
 
-const std::string& File() {
-    static const std::string file = Fuzz::Folder() + "/Dictionary.dat";
-    return file;
+std::string File() {
+    return Fuzz::Folder() + "/Dictionary.dat";
 }
 
 /// Mostly a short word of few letters, so that words meet; now and then anything.
@@ -79,9 +78,7 @@ void Save() {
 }
 
 void Load() {
-    for (const char* bad : {"/dev/zero", "/", "/no/such/file", "/proc/self/maps"}) {
-        REQUIRE(cReadBinaryDictionary(bad) == 0);
-    }
+    REQUIRE(cReadBinaryDictionary(Word().c_str()) == 0);
     REQUIRE(cReadBinaryDictionary(File().c_str()) == 1);
     Held = Saved;
     Max = SavedMax;
@@ -102,12 +99,17 @@ void Merge() {
 void Search() {
     std::string board(16, 'a');
     for (char& c : board) c = static_cast<char>('a' + Number() % 3);
+    cCheckForAllDefinedWords(Word().c_str());  // hardly ever a board
     const std::int32_t found = cCheckForAllDefinedWords(board.c_str());
     const Words before = Held;
     REQUIRE(cStartDecodingWords(0, 1) == 1);
+    const auto outside = [min = Min, max = Max](const std::string& word) {
+        return static_cast<int>(word.size()) < min || static_cast<int>(word.size()) > max;
+    };
     Remove();
     ChangeLimits();
     const Words results = Fuzz::Results(found);
+    REQUIRE(std::ranges::none_of(results, outside));
     REQUIRE(std::includes(before.begin(), before.end(), results.begin(), results.end()));
     Words listed;
     Fuzz::ReadListing(listed);
@@ -118,7 +120,6 @@ void Nonsense() {
     std::int32_t n = Number() - 128;
     char buffer[16];
     REQUIRE(cReadBinaryDictionary(nullptr) == 0 && cWriteBinaryDictionary(nullptr) == 0);
-    REQUIRE(cReadBinaryDictionary(Word().c_str()) == 0);
     REQUIRE(cDictionaryAdd(nullptr) == 0 && cDictionaryRemove(nullptr) == 0);
     REQUIRE(cDictionaryCheck(nullptr, nullptr, nullptr) == 0);
     REQUIRE(cDictIndex(-1 - Number(), 0) == -1 && cDictIndex(0, 26 + Number()) == -1);

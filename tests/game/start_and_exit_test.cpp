@@ -15,7 +15,6 @@ class StartAndExit : public ProgramFixture {
         cReadBinaryDictionary((folder_ / "program/Dictionary.dat").c_str());
         return cNumberOfWords();
     }
-    bool hasSettings() { return std::filesystem::exists(folder_ / "config/quorle/settings"); }
 
     /// A bad word comes into the dictionary, and another game is begun.
     void changeDictionary() {
@@ -38,7 +37,6 @@ TEST_F(StartAndExit, AStoredMaximumAboveTheDictionarysIsWarnedOf) {
         [this] { EXPECT_FALSE(isShown("Main")); });
     launch();
     EXPECT_EQ(State.MaxWordSizeOption, 12);
-    EXPECT_EQ(State.LetterBase, 97);
     press("Exit");  // nothing has changed: nothing is asked, nothing written
     EXPECT_FALSE(isShown("Main"));
     EXPECT_EQ(stored("MaxWordSize"), "40");
@@ -71,11 +69,9 @@ TEST_F(StartAndExit, AMissingOrDamagedDictionaryIsAnEmptyOne) {
         if (*content != 0) folder_.write("program/Dictionary.dat", content);
         relaunch();
         start("CATSBONEWILDHEFY");
-        EXPECT_EQ(text("DefinedWordCount"), "Quorle found 0 words");
         enter({"cat"});
         EXPECT_EQ(struck(), Words{"cat"});
-        press("End");
-        EXPECT_EQ(text("WordsLabel"), "0 words found");
+        EXPECT_EQ(text("DefinedWordCount"), "Quorle found 0 words");
     }
 }
 
@@ -85,8 +81,8 @@ TEST_F(StartAndExit, AChangeIsSavedOrDropped) {
     changeDictionary();
     expectSaveQuestion(QMessageBox::Yes);
     control("Main")->close();  // as the desktop closes it
-    for (const char* window : {"Main", "Results"}) EXPECT_FALSE(isShown(window)) << window;
-    EXPECT_FALSE(hasSettings());
+    EXPECT_FALSE(isShown("Main") || isShown("Results"));
+    EXPECT_FALSE(std::filesystem::exists(folder_ / "config/quorle/settings"));
     EXPECT_EQ(wordsInFile(), 2);
 
     makeDictionary({"cat"}, 12);
@@ -96,7 +92,6 @@ TEST_F(StartAndExit, AChangeIsSavedOrDropped) {
     cSetMaxWordSize(5);
     expectSaveQuestion(QMessageBox::No);
     press("Exit");
-    EXPECT_FALSE(isShown("Main"));
     EXPECT_EQ(stored("TimeLimit") + "/" + stored("MaxWordSize"), "60/12");
     EXPECT_EQ(wordsInFile(), 1);
 }

@@ -130,7 +130,7 @@ void ProgramFixture::menu(const std::string& command) {
 }
 
 void ProgramFixture::bringToFront(const std::string& window) {
-    Activate(*control(window));
+    Activate(*control(window)->window());
 }
 
 bool ProgramFixture::comesToFront(const std::string& window) {
