@@ -1,6 +1,7 @@
 #pragma once
 // The words that a search finds. What costs time is put off until the words are asked for: their
 // order, and their letters.
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <vector>
@@ -20,21 +21,19 @@ inline constexpr std::uint32_t EndsInQ = 0x100;
 /// Puts words in the order of their indexes. `room`: memory to use again, whatever it holds.
 void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room);
 
-/// Writes the word's letters, at most 16, and returns how many.
-inline std::size_t Spell(const FoundWord& word, const Board& board, char* letters) {
-    const std::size_t size = word.spelling % EndsInQ;
-    char* letter = letters + size;
-    std::uint64_t path = word.path;
-    if (word.spelling != size) [[unlikely]] {
-        *--letter = 'q';
-        path >>= 4;
-    }
-    while (letter != letters) {
-        const char face = board[path % Cubes];
-        path >>= 4;
-        if (face == 'q') [[unlikely]]
-            *--letter = 'u';
-        *--letter = face;
-    }
-    return size;
-}
+/// Writes the words of one board as letters.
+class Speller {
+  public:
+    explicit Speller(const Board& board);
+
+    /// Writes the word's letters, 2 to 16, and nothing behind them; returns how many.
+    std::size_t operator()(const FoundWord& word, char* letters) const;
+
+  private:
+    std::size_t cubeByCube(const FoundWord& word, char* letters) const;
+
+    Board board_;
+    bool hasQu_;
+    // The letters of each two cubes, the first in the higher byte.
+    std::array<std::uint16_t, Cubes * Cubes> pairs_;
+};

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -27,8 +28,8 @@ struct LastSearch {
     std::unique_ptr<BoardSearch> search;  // made by the first search
     Board board{};
     std::vector<FoundWord> words;
-    bool isSorted = false;
-    std::vector<FoundWord> room;  // for sorting
+    std::optional<Speller> speller;  // once the words are sorted
+    std::vector<FoundWord> room;     // for sorting
 };
 
 LastSearch Found;
@@ -86,7 +87,7 @@ bool LoadDictionary(const char* path) {
 /// Words found on a board that is 16 letters.
 void SearchBoard(std::string_view letters) {
     std::copy(letters.begin(), letters.end(), Found.board.begin());
-    Found.isSorted = false;
+    Found.speller.reset();
     // Out of memory, a search is left in its midst, and must not be used again.
     auto search = Found.search ? std::move(Found.search) : std::make_unique<BoardSearch>();
     search->search(TheDictionary.words, Found.board,
@@ -96,9 +97,11 @@ void SearchBoard(std::string_view letters) {
 
 /// Word i, of those there are, in alphabetical order; returns the number of its letters.
 std::size_t SpellFound(std::size_t i, char* letters) {
-    if (!Found.isSorted) SortFound(Found.words, Found.room);
-    Found.isSorted = true;
-    return Spell(Found.words[i], Found.board, letters);
+    if (!Found.speller) {
+        SortFound(Found.words, Found.room);
+        Found.speller.emplace(Found.board);
+    }
+    return (*Found.speller)(Found.words[i], letters);
 }
 
 }  // namespace

@@ -40,10 +40,11 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
         std::vector<FoundWord> room;
         search_->search(graph, board, limits, found);
         SortFound(found, room);
+        const Speller spell(board);
         Words words;
         for (const FoundWord& each : found) {
             std::array<char, 16> word{};
-            const std::string spelled(word.data(), Spell(each, board, word.data()));
+            const std::string spelled(word.data(), spell(each, word.data()));
             EXPECT_TRUE(words.empty() || *words.rbegin() < spelled) << spelled;
             words.insert(spelled);
         }
