@@ -25,11 +25,13 @@ void PutCode(std::vector<std::byte>& out, std::uint32_t code) {
 /// At most `most` of the values that occur, the most frequent first.
 std::vector<std::uint32_t> Frequent(const Codes& uses, std::size_t most) {
     std::vector<std::pair<std::uint32_t, std::uint32_t>> order;
+    order.reserve(uses.size());
     for (const auto& [value, count] : uses) order.emplace_back(~count, value);
     std::sort(order.begin(), order.end());
     order.resize(std::min(order.size(), most));
-    std::vector<std::uint32_t> values;
-    for (const auto& [count, value] : order) values.push_back(value);
+    std::vector<std::uint32_t> values(order.size());
+    std::transform(order.begin(), order.end(), values.begin(),
+                   [](const auto& use) { return use.second; });
     return values;
 }
 

@@ -10,10 +10,10 @@
 /// Has the system hand over the whole pages of new memory at once, where it can.
 inline void Populate([[maybe_unused]] void* memory, [[maybe_unused]] std::size_t bytes) {
 #if defined(MADV_POPULATE_WRITE)
-    const auto page = static_cast<std::uintptr_t>(sysconf(_SC_PAGESIZE));
-    const auto start = reinterpret_cast<std::uintptr_t>(memory);
-    const std::uintptr_t begin = (start + page - 1) / page * page;
-    const std::uintptr_t end = (start + bytes) / page * page;
-    if (begin < end) madvise(reinterpret_cast<void*>(begin), end - begin, MADV_POPULATE_WRITE);
+    const auto page = static_cast<std::size_t>(sysconf(_SC_PAGESIZE));
+    const std::size_t before = (page - reinterpret_cast<std::uintptr_t>(memory) % page) % page;
+    if (before >= bytes) return;
+    madvise(static_cast<char*>(memory) + before, (bytes - before) / page * page,
+            MADV_POPULATE_WRITE);
 #endif
 }

@@ -14,7 +14,7 @@ class RankSet {
         // Memory that the system hands out zeroed, page by page as it is used: a small file can
         // spell a huge number of words.
         words_.reset(
-            static_cast<std::uint64_t*>(std::calloc((count >> 6) + 1, sizeof *words_.get())));
+            static_cast<std::uint64_t*>(std::calloc((count >> 6) + 1, sizeof(std::uint64_t))));
         count_ = words_ ? count : 0;
         if (!words_) throw std::bad_alloc();
     }

@@ -8,6 +8,7 @@
 #include "board/tile_picture.h"
 #include "game/main_window.h"
 #include "game/windows.h"
+#include "platform/heap.h"
 #include "platform/legible_style.h"
 #include "platform/platform.h"
 #include "platform/session_end.h"
@@ -32,11 +33,13 @@ void FinishWindow() {
     const Main& window = Windows::Shared<Main>();
     TilePicture(true, QString(), window.devicePixelRatioF(),
                 window.palette().color(QPalette::Window));
+    TrimHeap();
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
+    PrepareHeap();
     Platform::UseDesktop();
     // Every window made anew has its pictures cached once more; ten times this is Qt's own bound.
     QPixmapCache::setCacheLimit(PictureCache);

@@ -22,7 +22,7 @@ PageViewer::PageViewer(QWidget* parent) : QTextBrowser(parent) {
 }
 
 QVariant PageViewer::loadResource(int type, const QUrl& name) {
-    const QVariant content = QTextBrowser::loadResource(type, name);
+    QVariant content = QTextBrowser::loadResource(type, name);
     if (type != QTextDocument::HtmlResource || !content.toByteArray().isEmpty()) return content;
     return NotFoundPage(name.isLocalFile() ? name.toLocalFile() : name.toString());
 }
