@@ -10,29 +10,11 @@
 #include "dictionary_codes.h"
 #include "node_store.h"
 
-/// Takes codes off the front of bytes.
-class CodeReader {
-  public:
-    explicit CodeReader(std::span<const std::byte> bytes)
-        : at_(bytes.data()), end_(bytes.data() + bytes.size()) {}
-
-    std::size_t left() const { return static_cast<std::size_t>(end_ - at_); }
-    bool isLong() const { return at_ != end_ && *at_ == std::byte{LongCode}; }
-    bool read(std::uint32_t& code);
-    /// A number of four bytes, which must be there.
-    std::uint32_t readFour();
-
-  private:
-    bool readSlowly(std::uint32_t& code);
-
-    const std::byte* at_;
-    const std::byte* end_;
-};
-
 class DictionaryDecoder {
   public:
     /// `bytes`: what follows the header.
-    DictionaryDecoder(const DictionaryHeader& header, std::span<const std::byte> bytes);
+    DictionaryDecoder(const DictionaryHeader& header, std::span<const std::byte> bytes)
+        : header_(header), code_(bytes.data()), end_(bytes.data() + bytes.size()) {}
 
     /// The finished base nodes, or null when the bytes are not exactly a graph of the header's
     /// counts. Throws std::bad_alloc.
@@ -47,28 +29,57 @@ class DictionaryDecoder {
     // The nodes that wait for a parent: at most the later letters of every node on one path.
     static constexpr std::uint32_t MostWaiting = LongestWord * Letters;
 
-    bool plausible() const;
-    bool readTables();
-    bool readNodes();
-    bool readNode(CodeReader& codes, std::uint32_t mask);
-    bool readLink(CodeReader& codes, std::uint32_t& waiting, Read& child, std::uint32_t& wordEnds);
-    bool share();
-    bool finished() const;
-
-    const DictionaryHeader& header_;
-    CodeReader codes_;
-    std::shared_ptr<NodeStore> store_;
-    std::uint32_t* cells_ = nullptr;
-    std::size_t used_ = 1;  // cells written
-    std::size_t all_ = 1;   // cells that the header promises
-    std::vector<std::uint32_t> masks_;
+    struct Shape {
+        std::uint32_t mask;
+        std::uint32_t cells;  // that a node with the mask takes
+    };
     // A link is twice the place of a node behind those that wait, plus 1 when a word ends: nothing
     // comes first there, then the shared nodes.
     static constexpr std::uint32_t FirstLink = 2;
-    std::array<std::uint32_t, OneByteCodes> shortLinks_{};  // of the codes of one byte
-    std::uint32_t firstNumber_ = 0;                         // the code of number 0
+    /// What the first byte of a link's code tells.
+    struct LinkStart {
+        std::uint32_t link;
+        std::uint16_t secondMask;  // of the second byte, which is added to the link
+        std::uint16_t isNew;       // 1: the link is to the newest node that waits
+    };
+    /// How far reading has come.
+    struct Progress {
+        const std::byte* code;
+        std::uint32_t* cell;
+        std::uint32_t waiting;
+        std::uint32_t shared;
+    };
+    static constexpr std::ptrdiff_t LongCodeSize = 5;
+    // No node takes more bytes, so its codes are looked at without asking for the end.
+    static constexpr std::ptrdiff_t MostNodeBytes = LongCodeSize * (1 + Letters);
+
+    bool plausible() const;
+    std::uint32_t takeFour();
+    bool readTables();
+    bool readShapes();
+    bool readLinkStarts();
+    bool readNodes();
+    template <bool NearEnd>
+    bool readNode(Progress& progress);
+    template <bool NearEnd>
+    bool readShape(const std::byte*& code, Shape& shape) const;
+    template <bool NearEnd>
+    bool readLink(const std::byte*& code, LinkStart& link) const;
+    template <bool NearEnd>
+    bool isThere(const std::byte* code) const;
+    bool share(Progress& progress);
+    bool finished() const;
+
+    const DictionaryHeader& header_;
+    const std::byte* code_;
+    const std::byte* end_;
+    std::shared_ptr<NodeStore> store_;
+    std::uint32_t* cells_ = nullptr;
+    std::uint32_t* cellsEnd_ = nullptr;  // of those that the header promises
+    std::vector<Shape> shapes_;          // of the table of masks
+    std::array<LinkStart, 256> links_{};
+    std::uint32_t firstNumber_ = 0;  // the code of number 0
     // Those that wait in MostWaiting places, then nothing, then the shared nodes by number.
     std::vector<Read> nodes_;
-    std::uint32_t waiting_ = 0;
-    std::uint32_t shared_ = 0;
+    Progress progress_{};
 };
