@@ -34,7 +34,7 @@ struct Chain {
     std::uint32_t firstWord;  // index of the first word below the node
     std::uint16_t used;       // bit i: cube i is in the chain
     std::uint16_t next;       // bit i: the chain can go on with cube i
-    std::uint32_t letters;
+    std::uint32_t letters;    // kept on boards with a Qu; on others as many as cubes
 };
 
 constexpr std::array<std::uint32_t, Cubes> MakeTouching() {
@@ -51,6 +51,7 @@ constexpr std::array<std::uint32_t, Cubes> MakeTouching() {
 }
 
 constexpr auto TouchingCubes = MakeTouching();
+constexpr std::array<std::uint32_t, Cubes> NoCubes{};
 
 /// On the way along a cube's letters.
 struct Step {
@@ -99,11 +100,12 @@ struct BoardSearch::State {
     Chain* extendBlock(const Match& match, const Chain* chain, const Chain* end, Chain* to,
                        std::uint32_t cubesUsed);
     template <class Match, bool HasQu>
-    void extend(const Match& match, const Chain& chain, std::uint32_t cube, Step step,
-                Output& output) const;
+    void extend(const Match& match, const std::uint32_t* around, const Chain& chain,
+                std::uint32_t cube, Step step, Output& output) const;
     void take(Step& step, std::uint32_t bit, std::uint32_t endsInQ, Output& output) const;
     void keepNew(const FoundWord* end);
-    Chain* thinOut(Chain* begin, Chain* end);
+    template <bool HasQu>
+    Chain* thinOut(Chain* begin, Chain* end, std::uint32_t cubesUsed);
 };
 
 // Only on boards with a Qu cube can chains of as many cubes have different numbers of letters.
@@ -132,8 +134,8 @@ inline void BoardSearch::State::run(NodeIndex root) {
         }
         Chain* const levelEnd = level->end;
         level->end -= std::min(levelEnd - level->begin, std::ptrdiff_t{Block});
-        Chain* const end = isHard ? thinOut(level->end, levelEnd) : levelEnd;
         const auto cubesUsed = static_cast<std::uint32_t>(level - levels.data());
+        Chain* const end = isHard ? thinOut<HasQu>(level->end, levelEnd, cubesUsed) : levelEnd;
         Chain* const longer =
             extendBlock<Match, HasQu>(match, level->end, end, levelEnd, cubesUsed);
         extended += static_cast<std::size_t>(end - level->end);
@@ -151,11 +153,13 @@ inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* c
                                               const Chain* end, Chain* to,
                                               std::uint32_t cubesUsed) {
     Output output{to, words.data()};
+    const bool mayGoOn = HasQu || cubesUsed + 1 < maxLetters;
+    const std::uint32_t* around = mayGoOn ? touching.data() : NoCubes.data();
     for (std::uint32_t next = chain->next; chain != end;) {
         const auto cube = static_cast<std::uint32_t>(std::countr_zero(next));
         const Step step{chain->path << 4 | cube, chain->node, chain->firstWord,
                         HasQu ? chain->letters : cubesUsed};
-        extend<Match, HasQu>(match, *chain, cube, step, output);
+        extend<Match, HasQu>(match, around, *chain, cube, step, output);
         next &= next - 1;
         const std::uint32_t isDone = IsLess(next, 1);
         next |= chain[1].next & (0 - isDone);
@@ -166,8 +170,9 @@ inline Chain* BoardSearch::State::extendBlock(const Match& match, const Chain* c
 }
 
 template <class Match, bool HasQu>
-inline void BoardSearch::State::extend(const Match& match, const Chain& chain, std::uint32_t cube,
-                                       Step step, Output& output) const {
+inline void BoardSearch::State::extend(const Match& match, const std::uint32_t* around,
+                                       const Chain& chain, std::uint32_t cube, Step step,
+                                       Output& output) const {
     const std::uint32_t bit = cubes[cube];
     if (!HasQu || bit != QBit) {
         take(step, bit, 0, output);
@@ -178,15 +183,15 @@ inline void BoardSearch::State::extend(const Match& match, const Chain& chain, s
         take(step, UBit, 0, output);
     }
     const std::uint32_t used = chain.used | (1U << cube);
-    const std::uint32_t mayGoOn = 0 - IsLess(step.letters, maxLetters);
-    const std::uint32_t next = match(nodes[step.node]) & touching[cube] & ~used & mayGoOn;
+    std::uint32_t next = match(nodes[step.node]) & around[cube] & ~used;
+    if constexpr (HasQu) next &= 0 - IsLess(step.letters, maxLetters);
     Chain& longer = *output.chains;
     longer.path = step.path;
     longer.node = step.node;
     longer.firstWord = step.firstWord;
     longer.used = static_cast<std::uint16_t>(used);
     longer.next = static_cast<std::uint16_t>(next);
-    longer.letters = step.letters;
+    if constexpr (HasQu) longer.letters = step.letters;
     output.chains += IsLess(0, next);
 }
 
@@ -195,13 +200,14 @@ inline void BoardSearch::State::take(Step& step, std::uint32_t bit, std::uint32_
                                      Output& output) const {
     const std::uint32_t* node = nodes + step.node;
     const std::uint32_t* link = node + LinkOffset(node[0], bit);
-    const std::uint32_t isWord = link[0] >> 31;
+    const std::uint32_t to = link[0];
+    const std::uint32_t isWord = to >> 31;
     ++step.letters;
     step.firstWord += link[1];
     *output.words = {step.path, step.firstWord, step.letters | endsInQ};
     output.words += isWord & ~IsLess(step.letters, minLetters);
     step.firstWord += isWord;
-    step.node = ChildOf(link[0]);
+    step.node = ChildOf(to);
 }
 
 // Of the block's words, those that are found for the first time.
@@ -217,11 +223,14 @@ inline void BoardSearch::State::keepNew(const FoundWord* end) {
 }
 
 // Drops the chains that need not be extended, and returns the new end.
-[[gnu::noinline]] Chain* BoardSearch::State::thinOut(Chain* begin, Chain* end) {
+template <bool HasQu>
+[[gnu::noinline]] Chain* BoardSearch::State::thinOut(Chain* begin, Chain* end,
+                                                     std::uint32_t cubesUsed) {
     Exhaustion exhaustion(nodes, found, minLetters, maxLetters);
     return std::remove_if(begin, end, [&](const Chain& chain) {
-        return exhaustion.holds(chain.node, chain.firstWord, chain.letters) ||
-               !recent.add(chain.firstWord, chain.letters, chain.used, chain.path % Cubes);
+        const std::uint32_t letters = HasQu ? chain.letters : cubesUsed;
+        return exhaustion.holds(chain.node, chain.firstWord, letters) ||
+               !recent.add(chain.firstWord, letters, chain.used, chain.path % Cubes);
     });
 }
 
