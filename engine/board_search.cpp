@@ -6,6 +6,7 @@
 #include "hard_boards.h"
 #include "letter_match.h"
 #include "rank_set.h"
+#include "wide_search.h"
 #include "without_branches.h"
 
 // All chains of one length are extended together, so that their nodes are fetched side by side and
@@ -91,7 +92,15 @@ struct BoardSearch::State {
 
     // Words found by the block being extended.
     std::array<FoundWord, 2 * Block * MostTouching + 1> words;
+#if defined(__x86_64__)
+    std::unique_ptr<WideSearch> wide;  // made by the first search it is for
+#endif
 
+    bool hasQu() const {
+        return std::find(cubes.begin(), cubes.end(), QBit) != cubes.end();
+    }
+
+    void runWide(NodeIndex root);
     template <class Match>
     void runAny(NodeIndex root);
     template <class Match, bool HasQu>
@@ -108,10 +117,17 @@ struct BoardSearch::State {
     Chain* thinOut(Chain* begin, Chain* end, std::uint32_t cubesUsed);
 };
 
+#if defined(__x86_64__)
+void BoardSearch::State::runWide(NodeIndex root) {
+    if (!wide) wide.reset(new WideSearch);
+    wide->run({nodes, root, cubes, touching, minLetters, maxLetters}, found, recent, *out);
+}
+#endif
+
 // Only on boards with a Qu cube can chains of as many cubes have different numbers of letters.
 template <class Match>
 inline void BoardSearch::State::runAny(NodeIndex root) {
-    if (std::find(cubes.begin(), cubes.end(), QBit) != cubes.end()) {
+    if (hasQu()) {
         run<Match, true>(root);
     } else {
         run<Match, false>(root);
@@ -255,13 +271,17 @@ bool CanMatch(Matching matching) {
     const bool bits = __builtin_cpu_supports("bmi") && __builtin_cpu_supports("popcnt");
     const bool avx2 = bits && __builtin_cpu_supports("avx2");
     if (matching == Matching::Avx2) return avx2;
-    if (matching == Matching::Avx512) return avx2 && __builtin_cpu_supports("avx512f");
+    const bool avx512 = avx2 && __builtin_cpu_supports("avx512f");
+    if (matching == Matching::Avx512) return avx512;
+    if (matching == Matching::Wide) return avx512 && WideSearch::canRun();
 #endif
     return matching == Matching::Plain;
 }
 
 Matching BestMatching() {
-    if (CanMatch(Matching::Avx512)) return Matching::Avx512;
+    for (const Matching best : {Matching::Wide, Matching::Avx512}) {
+        if (CanMatch(best)) return best;
+    }
     return CanMatch(Matching::Avx2) ? Matching::Avx2 : Matching::Plain;
 }
 
@@ -282,6 +302,12 @@ void BoardSearch::search(const WordGraph& graph, const Board& board, SearchLimit
     state.maxLetters = static_cast<std::uint32_t>(limits.maxLetters);
     switch (matching_) {
 #if defined(__x86_64__)
+        case Matching::Wide:
+            if (!state.hasQu()) {
+                state.runWide(graph.root());
+                break;
+            }
+            [[fallthrough]];
         case Matching::Avx512:
             RunAvx512(state, graph.root());
             break;

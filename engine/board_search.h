@@ -8,8 +8,9 @@
 #include "found_words.h"
 #include "word_graph.h"
 
-/// How the letters below a node are compared with those of the cubes; all find the same.
-enum class Matching { Plain, Avx2, Avx512 };
+/// How the letters below a node are compared with those of the cubes; all find the same. Wide:
+/// sixteen chains at once, and Avx512 on boards with a Qu cube.
+enum class Matching { Plain, Avx2, Avx512, Wide };
 
 /// Whether this machine can do it, and the best that it can.
 bool CanMatch(Matching matching);

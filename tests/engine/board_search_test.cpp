@@ -95,6 +95,7 @@ TEST_P(BoardSearchTest, HardBoards) {
 }
 
 INSTANTIATE_TEST_SUITE_P(All, BoardSearchTest,
-                         testing::Values(Matching::Plain, Matching::Avx2, Matching::Avx512));
+                         testing::Values(Matching::Plain, Matching::Avx2, Matching::Avx512,
+                                         Matching::Wide));
 
 }  // namespace
