@@ -7,12 +7,16 @@
 
 namespace {
 
-// Three rounds for a quarter of a million words, each with few digits to add up.
-constexpr unsigned DigitBits = 6;
-constexpr std::uint32_t Digits = 1U << DigitBits;
+// A quarter of a million indexes have three digits of few values each, or two of many, which take
+// longer to add up.
+constexpr unsigned FewBits = 6;
+constexpr unsigned ManyBits = 9;
+constexpr std::size_t ManyWords = 300;
 
 /// Sorts by one digit of the index and keeps the order of those that are equal in it.
+template <unsigned DigitBits>
 void SortByDigit(const std::vector<FoundWord>& from, std::vector<FoundWord>& to, unsigned shift) {
+    constexpr std::uint32_t Digits = 1U << DigitBits;
     std::array<std::uint32_t, Digits> places{};
     for (const FoundWord& word : from) ++places[(word.index >> shift) % Digits];
     std::uint32_t before = 0;
@@ -22,6 +26,16 @@ void SortByDigit(const std::vector<FoundWord>& from, std::vector<FoundWord>& to,
         before += count;
     }
     for (const FoundWord& word : from) to[places[(word.index >> shift) % Digits]++] = word;
+}
+
+template <unsigned DigitBits>
+void SortByDigits(std::vector<FoundWord>& words, std::vector<FoundWord>& room) {
+    std::uint32_t largest = 0;
+    for (const FoundWord& word : words) largest = std::max(largest, word.index);
+    for (unsigned shift = 0; shift < 32 && largest >> shift != 0; shift += DigitBits) {
+        SortByDigit<DigitBits>(words, room, shift);
+        words.swap(room);
+    }
 }
 
 /// Writes a number's bytes, the highest first.
@@ -38,12 +52,8 @@ void Store(Number number, char* to) {
 
 void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room) {
     room.resize(words.size());
-    std::uint32_t largest = 0;
-    for (const FoundWord& word : words) largest = std::max(largest, word.index);
-    for (unsigned shift = 0; shift < 32 && largest >> shift != 0; shift += DigitBits) {
-        SortByDigit(words, room, shift);
-        words.swap(room);
-    }
+    const bool many = words.size() >= ManyWords;
+    many ? SortByDigits<ManyBits>(words, room) : SortByDigits<FewBits>(words, room);
 }
 
 Speller::Speller(const Board& board)

@@ -295,15 +295,19 @@ void WideSearch::moveChain(std::size_t from, std::size_t to) {
 
 // Of the block's words, those that are found for the first time.
 void WideSearch::keepNew(std::size_t count, std::uint32_t letters) {
-    std::size_t size = out_->size();
-    out_->resize(size + count);
-    FoundWord* const kept = out_->data();
+    std::size_t isNew = 0;
     for (std::size_t i = 0; i < count; ++i) {
-        const std::uint64_t path = std::uint64_t{words_.high[i]} << 32 | words_.low[i];
-        kept[size] = {path, words_.index[i], letters};
-        size += found_->insert(words_.index[i]);
+        words_.isNew[isNew] = static_cast<std::uint32_t>(i);
+        isNew += found_->insert(words_.index[i]);
     }
-    out_->resize(size);
+    const std::size_t size = out_->size();
+    out_->resize(size + isNew);
+    FoundWord* const kept = out_->data() + size;
+    for (std::size_t i = 0; i < isNew; ++i) {
+        const std::uint32_t word = words_.isNew[i];
+        const std::uint64_t path = std::uint64_t{words_.high[word]} << 32 | words_.low[word];
+        kept[i] = {path, words_.index[word], letters};
+    }
 }
 
 #endif

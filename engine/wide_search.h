@@ -54,6 +54,7 @@ class WideSearch {
         std::array<std::uint32_t, StepRoom> index;
         std::array<std::uint32_t, StepRoom> low;
         std::array<std::uint32_t, StepRoom> high;
+        std::array<std::uint32_t, StepRoom> isNew;  // numbers of those found for the first time
     };
     /// What becomes of a block's chains, each with each cube that it can go on with.
     struct Steps {
