@@ -12,12 +12,11 @@
 #include <bit>
 #include <cstring>
 
-// Works like board_search.cpp, which tells the order in which chains are extended. A step joins a
-// cube to a chain. The steps of sixteen chains are listed and taken sixteen at a time: each lane
-// fetches what it needs of its chain from the registers that hold all sixteen, takes the letter's
-// link from the graph, and looks which cubes come next. What has become of it, a word, a chain
-// that can go on, both or nothing, decides whether the lane is written; those that are move up to
-// each other, so that again no branch depends on what the board shows.
+// Works like board_search.cpp, which tells in what order chains are extended and why. A step joins
+// a cube to a chain. A block's steps are taken together, one thing for all of them after the other:
+// each is listed, with what it has of its chain; its link is fetched and followed, words are kept;
+// the mask of its node is fetched, and those that can go on become chains. Where only some of
+// sixteen lanes are kept they move up to each other, so no branch depends on what the board shows.
 
 // What a processor must have, for every function that touches the registers.
 #define QUORLE_WIDE \
