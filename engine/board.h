@@ -3,6 +3,7 @@
 #include <array>
 
 inline constexpr int Cubes = 16;
+inline constexpr int MostTouching = 8;  // cubes around a cube
 
 /// The letters "a" to "z" of the cubes, row by row; "q" stands for the Qu cube.
 using Board = std::array<char, Cubes>;

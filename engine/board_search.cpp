@@ -21,9 +21,7 @@
 
 namespace {
 
-constexpr std::size_t Block = 512;        // chains extended together
-constexpr std::size_t HardAfter = 16384;  // chains extended, before they are looked at twice
-constexpr std::size_t MostTouching = 8;   // cubes around a cube
+constexpr std::size_t Block = 512;  // chains extended together
 constexpr std::uint32_t QBit = 1U << ('q' - 'a');
 constexpr std::uint32_t UBit = 1U << ('u' - 'a');
 

@@ -7,6 +7,9 @@
 #include "node_store.h"
 #include "rank_set.h"
 
+/// A board is hard when so many chains have been extended; from then on they are looked at twice.
+inline constexpr std::size_t HardAfter = 16384;
+
 /// Remembers the chains extended of late, not all: a chain that is forgotten is extended again.
 /// To be cleared before its first use.
 class RecentChains {

@@ -24,8 +24,6 @@
 
 namespace {
 
-constexpr std::size_t HardAfter = 16384;  // chains extended, before they are looked at twice
-
 constexpr std::array<std::uint8_t, 64> MakeNumbers() {
     std::array<std::uint8_t, 64> numbers{};
     for (std::uint8_t i = 0; i < 64; ++i) numbers[i] = i;

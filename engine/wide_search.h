@@ -34,8 +34,7 @@ class WideSearch {
 
   private:
     static constexpr std::size_t Lanes = 16;
-    static constexpr std::size_t Block = 512;       // chains extended together
-    static constexpr std::size_t MostTouching = 8;  // cubes around a cube
+    static constexpr std::size_t Block = 512;  // chains extended together
     // Each level takes what one block can grow to; whole registers are written at its end.
     static constexpr std::size_t Room = (Cubes + 1) * Block * MostTouching + Lanes;
     static constexpr std::size_t StepRoom = Block * MostTouching + 2 * Lanes;
