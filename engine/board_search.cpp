@@ -87,16 +87,13 @@ struct BoardSearch::State {
     const std::uint32_t* nodes;
     std::uint32_t minLetters;
     std::uint32_t maxLetters;
+    bool hasQu;
 
     // Words found by the block being extended.
     std::array<FoundWord, 2 * Block * MostTouching + 1> words;
 #if defined(__x86_64__)
     std::unique_ptr<WideSearch> wide;  // made by the first search it is for
 #endif
-
-    bool hasQu() const {
-        return std::find(cubes.begin(), cubes.end(), QBit) != cubes.end();
-    }
 
     void runWide(NodeIndex root);
     template <class Match>
@@ -125,7 +122,7 @@ void BoardSearch::State::runWide(NodeIndex root) {
 // Only on boards with a Qu cube can chains of as many cubes have different numbers of letters.
 template <class Match>
 inline void BoardSearch::State::runAny(NodeIndex root) {
-    if (hasQu()) {
+    if (hasQu) {
         run<Match, true>(root);
     } else {
         run<Match, false>(root);
@@ -293,6 +290,7 @@ void BoardSearch::search(const WordGraph& graph, const Board& board, SearchLimit
     if (limits.minLetters > limits.maxLetters) return;
     State& state = *state_;
     for (std::size_t i = 0; i < board.size(); ++i) state.cubes[i] = LetterBit(board[i]);
+    state.hasQu = HasQu(board);
     state.found.resize(graph.size());
     state.out = &found;
     state.nodes = graph.nodes();
@@ -301,7 +299,7 @@ void BoardSearch::search(const WordGraph& graph, const Board& board, SearchLimit
     switch (matching_) {
 #if defined(__x86_64__)
         case Matching::Wide:
-            if (!state.hasQu()) {
+            if (!state.hasQu) {
                 state.runWide(graph.root());
                 break;
             }

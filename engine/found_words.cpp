@@ -56,8 +56,7 @@ void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room) {
     many ? SortByDigits<ManyBits>(words, room) : SortByDigits<FewBits>(words, room);
 }
 
-Speller::Speller(const Board& board)
-    : board_(board), hasQu_(std::find(board.begin(), board.end(), 'q') != board.end()) {
+Speller::Speller(const Board& board) : board_(board), hasQu_(HasQu(board)) {
     std::uint16_t* pair = pairs_.data();
     for (const char first : board) {
         for (const char second : board) {
