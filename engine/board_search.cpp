@@ -6,13 +6,10 @@
 #include "hard_boards.h"
 #include "letter_match.h"
 #include "rank_set.h"
+#include "search_order.h"
 #include "wide_search.h"
 #include "without_branches.h"
 
-// All chains of one length are extended together, so that their nodes are fetched side by side and
-// the inner loop runs long. When there are very many, they are taken in blocks, and each block's
-// longer chains first: so memory is bounded whatever the board.
-//
 // A chain carries the index of the first word below its node. A word found is marked by its index,
 // so that one found along many chains counts once.
 //
@@ -21,7 +18,6 @@
 
 namespace {
 
-constexpr std::size_t Block = 512;  // chains extended together
 constexpr std::uint32_t QBit = 1U << ('q' - 'a');
 constexpr std::uint32_t UBit = 1U << ('u' - 'a');
 
@@ -66,19 +62,13 @@ struct Output {
     FoundWord* words;
 };
 
-/// Chains of as many cubes as the level's number, one behind the other.
-struct Level {
-    Chain* begin;
-    Chain* end;
-};
-
 }  // namespace
 
 struct BoardSearch::State {
     // The chains that wait to be extended, level behind level: a stack, of which each level takes
     // what one block can grow to. One chain more may be written and not counted.
     std::array<Chain, (Cubes + 1) * Block * MostTouching + 1> chains;
-    std::array<Level, Cubes + 2> levels;
+    std::array<Level<Chain*>, Cubes + 2> levels;
     CubeBits cubes;
     std::array<std::uint32_t, Cubes> touching = TouchingCubes;  // where it is at hand
     RankSet found;
@@ -135,27 +125,14 @@ inline void BoardSearch::State::run(NodeIndex root) {
     chains[0] = {0, root, 0, 0, static_cast<std::uint16_t>(match(nodes[root])), 0};
     if (chains[0].next == 0) return;
     levels[0] = {chains.data(), chains.data() + 1};
-    std::size_t extended = 0;
-    bool isHard = false;
-    for (Level* level = levels.data();;) {
-        if (level->begin == level->end) {
-            if (level == levels.data()) return;
-            --level;
-            continue;
-        }
-        Chain* const levelEnd = level->end;
-        level->end -= std::min(levelEnd - level->begin, std::ptrdiff_t{Block});
-        const auto cubesUsed = static_cast<std::uint32_t>(level - levels.data());
-        Chain* const end = isHard ? thinOut<HasQu>(level->end, levelEnd, cubesUsed) : levelEnd;
-        Chain* const longer =
-            extendBlock<Match, HasQu>(match, level->end, end, levelEnd, cubesUsed);
-        extended += static_cast<std::size_t>(end - level->end);
-        if (!isHard && extended >= HardAfter) {
-            isHard = true;
-            recent.clear();
-        }
-        *++level = {levelEnd, longer};
-    }
+    ExtendAll(
+        levels.data(), recent,
+        [&](Chain* begin, Chain* end, std::uint32_t cubesUsed) {
+            return thinOut<HasQu>(begin, end, cubesUsed);
+        },
+        [&](const Chain* begin, const Chain* end, Chain* to, std::uint32_t cubesUsed) {
+            return extendBlock<Match, HasQu>(match, begin, end, to, cubesUsed);
+        });
 }
 
 // Writes the longer chains to `to` and returns their end.

@@ -12,11 +12,11 @@
 #include <bit>
 #include <cstring>
 
-// Works like board_search.cpp, which tells in what order chains are extended and why. A step joins
-// a cube to a chain. A block's steps are taken together, one thing for all of them after the other:
-// each is listed, with what it has of its chain; its link is fetched and followed, words are kept;
-// the mask of its node is fetched, and those that can go on become chains. Where only some of
-// sixteen lanes are kept they move up to each other, so no branch depends on what the board shows.
+// A step joins a cube to a chain. A block's steps are taken together, one thing for all of them
+// after the other: each is listed, with what it has of its chain; its link is fetched and followed,
+// words are kept; the mask of its node is fetched, and those that can go on become chains. Where
+// only some of sixteen lanes are kept they move up to each other, so no branch depends on what the
+// board shows.
 
 // What a processor must have, for every function that touches the registers.
 #define QUORLE_WIDE \
@@ -92,26 +92,14 @@ void WideSearch::run(const WideSearchTask& task, RankSet& found, RecentChains& r
     recent_ = &recent;
     out_ = &out;
     if (!start()) return;
-    std::size_t extended = 0;
-    bool isHard = false;
-    for (Level* level = levels_.data();;) {
-        if (level->begin == level->end) {
-            if (level == levels_.data()) return;
-            --level;
-            continue;
-        }
-        const std::size_t levelEnd = level->end;
-        level->end -= std::min(levelEnd - level->begin, Block);
-        const auto letters = static_cast<std::uint32_t>(level - levels_.data());
-        const std::size_t end = isHard ? thinOut(level->end, levelEnd, letters) : levelEnd;
-        const std::size_t longer = extendBlock(level->end, end, levelEnd, letters + 1);
-        extended += end - level->end;
-        if (!isHard && extended >= HardAfter) {
-            isHard = true;
-            recent.clear();
-        }
-        *++level = {levelEnd, longer};
-    }
+    ExtendAll(
+        levels_.data(), recent,
+        [this](std::size_t begin, std::size_t end, std::uint32_t letters) {
+            return thinOut(begin, end, letters);
+        },
+        [this](std::size_t begin, std::size_t end, std::size_t to, std::uint32_t letters) {
+            return extendBlock(begin, end, to, letters + 1);
+        });
 }
 
 // The chain of no cube; false when no word begins with a cube of the board.

@@ -13,6 +13,7 @@
 #include "letter_match.h"
 #include "node_store.h"
 #include "rank_set.h"
+#include "search_order.h"
 
 struct WideSearchTask {
     const std::uint32_t* nodes;
@@ -34,7 +35,6 @@ class WideSearch {
 
   private:
     static constexpr std::size_t Lanes = 16;
-    static constexpr std::size_t Block = 512;  // chains extended together
     // Each level takes what one block can grow to; whole registers are written at its end.
     static constexpr std::size_t Room = (Cubes + 1) * Block * MostTouching + Lanes;
     static constexpr std::size_t StepRoom = Block * MostTouching + 2 * Lanes;
@@ -67,10 +67,6 @@ class WideSearch {
         std::array<std::uint32_t, StepRoom> used;
         std::array<std::uint32_t, StepRoom> around;  // cubes that touch the last one, not used
     };
-    struct Level {
-        std::size_t begin;
-        std::size_t end;
-    };
     struct Parents;
 
     bool start();
@@ -91,7 +87,7 @@ class WideSearch {
     RankSet* found_ = nullptr;
     RecentChains* recent_ = nullptr;
     std::vector<FoundWord>* out_ = nullptr;
-    std::array<Level, Cubes + 2> levels_;
+    std::array<Level<std::size_t>, Cubes + 2> levels_;
     Chains chains_;
     Words words_;
     Steps steps_;
