@@ -2,8 +2,8 @@
 
 #include <cmath>
 
-#include "game/game_state.h"
 #include "platform/platform.h"
+#include "state/game_state.h"
 
 namespace {
 

@@ -1,9 +1,9 @@
 #include "board/draw_cubes.h"
 
-#include "board/cube_tile.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/cube_tile.h"
+#include "main_window/main_window.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 

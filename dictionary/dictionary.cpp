@@ -38,4 +38,10 @@ void RemoveFromDictionary(const std::string& word) {
     State.DictionaryChanged = True;
 }
 
+void ShortenDictionary(std::int16_t letters) {
+    cSetMaxWordSize(letters);
+    cReduceWordSize();
+    State.DictionaryChanged = True;
+}
+
 }  // namespace Dictionary

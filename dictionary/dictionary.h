@@ -2,7 +2,7 @@
 // The game's dealings with the dictionary that the word engine holds.
 #include <string>
 
-#include "game/game_state.h"
+#include "state/game_state.h"
 
 namespace Dictionary {
 
@@ -21,5 +21,9 @@ Boolean IsInDictionary(const std::string& word);
 /// Change the dictionary and mark it changed.
 void AddToDictionary(const std::string& word);
 void RemoveFromDictionary(const std::string& word);
+
+/// Makes `letters` (2..16) the maximum word size, drops the longer words and marks
+/// the dictionary changed.
+void ShortenDictionary(std::int16_t letters);
 
 }  // namespace Dictionary

@@ -11,15 +11,12 @@
 #include "dictionary/dictionary.h"
 #include "dictionary/editor_window.h"
 #include "dictionary/listing.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
+#include "state/windows.h"
 
 namespace {
-
-constexpr int ShortestAddable = 3;
-constexpr int LongestAddable = 16;
 
 bool IsLetter(QChar character) {
     return character >= 'a' && character <= 'z';
@@ -27,7 +24,7 @@ bool IsLetter(QChar character) {
 
 // What keeps a word out, empty when nothing does.
 std::string Objection(const QString& word) {
-    if (word.size() < ShortestAddable || word.size() > LongestAddable) {
+    if (word.size() < UsualShortestWord || word.size() > LongestWord) {
         return "Words must be 3 to 16 letters long.";
     }
     if (!std::all_of(word.begin(), word.end(), IsLetter)) {

@@ -12,22 +12,19 @@
 #include "dictionary/editor_commands.h"
 #include "dictionary/listing.h"
 #include "dictionary/merge.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/layout.h"
 #include "platform/list_keys.h"
 #include "platform/menu_bar.h"
+#include "state/game_rules.h"
+#include "state/windows.h"
 
 namespace {
 
 constexpr int ClientWidth = 5910;
 constexpr int ClientHeight = 7470;
-constexpr int LongestWord = 16;
 constexpr int PrefixesInView = 16;
 
-QFont WordFont() {
-    return LayoutFont(Typeface::Courier, 18, true);
-}
 QFont ButtonFont() {
     return LayoutFont(Typeface::SansSerif, 13.5);
 }

@@ -11,13 +11,12 @@
 #include <array>
 
 #include "dictionary/editor_window.h"
-#include "game/windows.h"
 #include "platform/layout.h"
+#include "state/windows.h"
 
 namespace {
 
 constexpr std::int32_t Letters = 26;
-constexpr int LongestWord = 16;
 
 QString Prefix(std::int32_t first, std::int32_t second) {
     return QString(QChar('A' + first)) + QChar('A' + second);
@@ -52,9 +51,8 @@ QStringList WordsWith(const QString& prefix) {
 }
 
 void ShowWordCount(QLabel& label) {
-    const QString text = QString("%1 words").arg(cNumberOfWords());
-    label.setFont(Condensed(LayoutFont(Typeface::SansSerif, 12), text, label.width()));
-    label.setText(text);
+    ShowFitting(label, LayoutFont(Typeface::SansSerif, 12),
+                QString("%1 words").arg(cNumberOfWords()));
 }
 
 }  // namespace

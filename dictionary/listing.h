@@ -1,7 +1,7 @@
 #pragma once
 // What the dictionary editor shows: the prefixes that have words, and the words of
 // the prefix selected. The word engine holds the words; no copy is kept.
-#include "game/game_state.h"
+#include "state/game_state.h"
 
 namespace Dictionary {
 

@@ -8,10 +8,10 @@
 #include "dictionary/editor_window.h"
 #include "dictionary/listing.h"
 #include "dictionary/progress_window.h"
-#include "game/game_state.h"
-#include "game/windows.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 

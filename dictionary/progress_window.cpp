@@ -5,9 +5,9 @@
 #include <QTimer>
 
 #include "dictionary/merge.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/layout.h"
+#include "state/windows.h"
 
 namespace {
 

@@ -18,25 +18,20 @@ bool IsLastUnit(std::string_view rest) {
     return rest.size() == 1 || rest == Qu;
 }
 
-void ClearTracedPath() {
-    for (std::size_t row = 0; row < BoardSize; ++row) {
-        for (std::size_t column = 0; column < BoardSize; ++column) {
-            State.TracedPath[row][column] = False;
-        }
-    }
-}
-
-bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view rest) {
+bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view rest,
+               BoardMarks& path) {
     const std::string_view unit = LetterUnit(rest);
     const std::size_t lastRow = std::min<std::size_t>(fromRow + 1, BoardSize - 1);
     const std::size_t lastColumn = std::min<std::size_t>(fromColumn + 1, BoardSize - 1);
     for (std::size_t row = fromRow - std::min<std::size_t>(fromRow, 1); row <= lastRow; ++row) {
         for (std::size_t column = fromColumn - std::min<std::size_t>(fromColumn, 1);
              column <= lastColumn; ++column) {
-            Boolean& mark = State.TracedPath[row][column];
+            Boolean& mark = path[row][column];
             if (mark || State.BoardGrid[row][column] != unit) continue;
             mark = True;
-            if (IsLastUnit(rest) || TraceFrom(row, column, rest.substr(unit.size()))) return true;
+            if (IsLastUnit(rest) || TraceFrom(row, column, rest.substr(unit.size()), path)) {
+                return true;
+            }
             mark = False;
         }
     }
@@ -47,21 +42,27 @@ bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view res
 
 namespace CheckCubes {
 
-Boolean IsOnBoard(std::string_view word) {
-    if (word.empty()) {
-        ClearTracedPath();
-        return True;
-    }
+Trace TraceWord(std::string_view word) {
+    if (word.empty()) return {True, BoardMarks{}};
+    std::optional<BoardMarks> path;
     const std::string_view unit = LetterUnit(word);
     for (std::size_t row = 0; row < BoardSize; ++row) {
         for (std::size_t column = 0; column < BoardSize; ++column) {
             if (State.BoardGrid[row][column] != unit) continue;
-            ClearTracedPath();
-            State.TracedPath[row][column] = True;
-            if (IsLastUnit(word) || TraceFrom(row, column, word.substr(unit.size()))) return True;
+            path.emplace();
+            (*path)[row][column] = True;
+            if (IsLastUnit(word) || TraceFrom(row, column, word.substr(unit.size()), *path)) {
+                return {True, path};
+            }
         }
     }
-    return False;
+    return {False, path};
+}
+
+Boolean IsOnBoard(std::string_view word) {
+    const Trace trace = TraceWord(word);
+    if (trace.path) State.TracedPath = *trace.path;
+    return trace.found;
 }
 
 // No chain spells more than its cubes can, so a long paste is cut to that first.

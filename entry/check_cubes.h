@@ -1,17 +1,26 @@
 #pragma once
 // The one judge of whether a word lies on the board.
 #include <cstddef>
+#include <optional>
 #include <string_view>
 
-#include "game/game_state.h"
+#include "state/game_state.h"
 
 namespace CheckCubes {
 
-/// True when `word` lies on the board along a chain of touching cubes, none used
-/// twice; TracedPath then marks the chain, of several the one with the smallest
-/// board indexes from its first cube on. The empty word is on every board and
-/// marks nothing. After a failure the last cube, in board order, that shows the
-/// word's first letter stays marked; where none does, TracedPath stays as it was.
+struct Trace {
+    Boolean found;
+    std::optional<BoardMarks> path;
+};
+
+/// Whether `word` lies on the board along a chain of touching cubes, none used twice,
+/// and the chain, of several the one with the smallest board indexes from its first
+/// cube on. The empty word is on every board and marks nothing. After a failure the
+/// path marks the last cube, in board order, that shows the word's first letter;
+/// there is no path where none does.
+Trace TraceWord(std::string_view word);
+
+/// The same; TracedPath takes the path where there is one.
 Boolean IsOnBoard(std::string_view word);
 
 /// The number of bytes, from the front, of the longest beginning of `text` that

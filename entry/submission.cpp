@@ -12,10 +12,10 @@
 #include "entry/check_cubes.h"
 #include "entry/typed_text.h"
 #include "entry/word_entry.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/layout.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 
@@ -31,7 +31,7 @@ void ListWord(Main& window, const std::string& word) {
     const QString text = QString::fromStdString(word);
     list.insertRow(0);
     auto* cell = new QTableWidgetItem(text);
-    QFont font = Condensed(LayoutFont(Typeface::Courier, 18, true), text, RowTextWidth(list));
+    QFont font = Condensed(WordFont(), text, RowTextWidth(list));
     if (!Dictionary::IsInDictionary(word)) {
         font.setStrikeOut(true);
         cell->setData(Qt::AccessibleDescriptionRole, "not in dictionary");

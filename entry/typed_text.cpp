@@ -3,7 +3,7 @@
 #include <algorithm>
 
 #include "entry/check_cubes.h"
-#include "game/game_state.h"
+#include "state/game_state.h"
 
 std::string LowerCase(std::string_view text) {
     std::string lower(text);

@@ -6,10 +6,10 @@
 #include "entry/check_cubes.h"
 #include "entry/submission.h"
 #include "entry/typed_text.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/platform.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 

@@ -10,13 +10,13 @@
 
 #include "board/dice.h"
 #include "board/draw_cubes.h"
-#include "game/format_time.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
 #include "results/end_of_game.h"
+#include "state/format_time.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 
@@ -43,9 +43,8 @@ void OpenWordEntry(Main& window) {
 }
 
 void ShowComputerWordCount(QLabel& label) {
-    const QString text = QString("Quorle found %1 words").arg(State.ComputerWordCount);
-    label.setFont(Condensed(LayoutFont(Typeface::SansSerif, 13.5), text, label.width()));
-    label.setText(text);
+    ShowFitting(label, LayoutFont(Typeface::SansSerif, 13.5),
+                QString("Quorle found %1 words").arg(State.ComputerWordCount));
 }
 
 // The window in front at the first counted tick is the one the clock needs from
@@ -71,7 +70,7 @@ void StartGame() {
     ShowComputerWordCount(*window.DefinedWordCount);
     window.update();
     State.TimeRemaining = State.TimeLimit;
-    SetTimeLabels("Time Remaining", TimeText(State.TimeLimit));
+    window.SetTimeLabels("Time Remaining", TimeText(State.TimeLimit));
     window.GameClock->start();
 }
 
@@ -95,12 +94,6 @@ void ClockTick() {
     --State.TimeRemaining;
     Windows::Shared<Main>().TimeLeft->setText(TimeText(State.TimeRemaining));
     if (State.TimeRemaining == 0) EndGame();
-}
-
-void SetTimeLabels(const QString& caption, const QString& value) {
-    Main& window = Windows::Shared<Main>();
-    window.TimeRemLabel->setText(caption);
-    window.TimeLeft->setText(value);
 }
 
 }  // namespace Common

@@ -1,6 +1,5 @@
 #pragma once
 // One game, from Start to its end: the clock, pausing and stopping.
-#include <QString>
 
 namespace Common {
 
@@ -15,8 +14,5 @@ void StopGame();
 
 /// Counts one second, while the game's window is in front and no pause is shown.
 void ClockTick();
-
-/// Captions of TimeRemLabel and TimeLeft.
-void SetTimeLabels(const QString& caption, const QString& value);
 
 }  // namespace Common

@@ -4,9 +4,9 @@
 #include <QTextBrowser>
 #include <QUrl>
 
-#include "game/windows.h"
 #include "help/help_window.h"
 #include "platform/platform.h"
+#include "state/windows.h"
 
 namespace Common {
 

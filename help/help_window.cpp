@@ -3,11 +3,11 @@
 #include <QAction>
 #include <QCloseEvent>
 
-#include "game/windows.h"
 #include "help/help_commands.h"
 #include "help/page_viewer.h"
 #include "platform/layout.h"
 #include "platform/menu_bar.h"
+#include "state/windows.h"
 
 namespace {
 

@@ -6,20 +6,20 @@
 #include <QComboBox>
 #include <optional>
 
-#include "game/format_time.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/settings.h"
-#include "game/windows.h"
+#include "dictionary/dictionary.h"
+#include "main_window/main_window.h"
 #include "options/options_window.h"
+#include "options/settings.h"
 #include "platform/platform.h"
+#include "state/format_time.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 
-constexpr int SmallestOffered = 3;  // letters
-constexpr int LargestOffered = 16;
-
-const QStringList GameTimes{"0:15", "0:30", "1:00", "2:00", "3:00", "4:00", "5:00"};
+QString TimeEntry(std::int16_t seconds) {
+    return QString::fromStdString(FormatTime(seconds));
+}
 
 QString SizeEntry(std::int32_t letters) {
     return QString("%1 letters").arg(letters);
@@ -73,9 +73,7 @@ void ApplyMaxWordSize(std::int16_t size) {
                                std::to_string(size) + " letters from the dictionary?",
                            Platform::ProgramTitle);
     if (!remove) return Common::LoadOptions();
-    cSetMaxWordSize(size);
-    cReduceWordSize();
-    State.DictionaryChanged = True;
+    Dictionary::ShortenDictionary(size);
 }
 
 }  // namespace
@@ -88,9 +86,11 @@ void ShowOptions() {
 
 void LoadOptions() {
     OptionsDialog& window = Windows::Shared<OptionsDialog>();
+    QStringList times;
+    for (const std::int16_t seconds : GameTimes) times += TimeEntry(seconds);
     QStringList sizes;
-    for (int size = SmallestOffered; size <= LargestOffered; ++size) sizes += SizeEntry(size);
-    Fill(*window.TimeCombo, GameTimes, QString::fromStdString(FormatTime(State.TimeLimit)));
+    for (int size = UsualShortestWord; size <= LongestWord; ++size) sizes += SizeEntry(size);
+    Fill(*window.TimeCombo, times, TimeEntry(State.TimeLimit));
     Fill(*window.MinWordSizeCombo, sizes, SizeEntry(cMinWordSize()));
     Fill(*window.WordSizeCombo, sizes, SizeEntry(cMaxWordSize()));
     window.SoundsOption->setChecked(State.Sounds);

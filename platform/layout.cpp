@@ -67,6 +67,10 @@ QFont LayoutFont(Typeface typeface, double points, bool bold) {
     return FontOf(typeface, static_cast<int>(std::lround(points * PixelsPerPoint)), bold);
 }
 
+QFont WordFont() {
+    return LayoutFont(Typeface::Courier, 18, true);
+}
+
 QFont PlainFont() {
     return FontOf(Typeface::SansSerif, PlainFontPixels, false);
 }
@@ -100,6 +104,11 @@ QFont Condensed(QFont font, const QString& text, int width) {
     const int natural = QFontMetrics(font).horizontalAdvance(text);
     if (natural > width) font.setStretch(QFont::Unstretched * width / natural);
     return font;
+}
+
+void ShowFitting(QLabel& label, const QFont& font, const QString& text) {
+    label.setFont(Condensed(font, text, label.width()));
+    label.setText(text);
 }
 
 int RowTextWidth(const QAbstractScrollArea& list) {

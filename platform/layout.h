@@ -35,6 +35,9 @@ enum class Typeface { SansSerif, Arial, Courier };
 /// A font of `points` (72 to the inch, the inch being 96 logical pixels).
 QFont LayoutFont(Typeface typeface, double points, bool bold = false);
 
+/// The font of words in lists and text boxes.
+QFont WordFont();
+
 /// The font of controls that name none.
 QFont PlainFont();
 
@@ -50,6 +53,9 @@ void SetDefaultButton(QWidget* window, QAbstractButton* button);
 /// The font made narrower until `text` fits into `width` logical pixels, where it
 /// does not by itself.
 QFont Condensed(QFont font, const QString& text, int width);
+
+/// Shows a text in a label, in `font` condensed to the label's width.
+void ShowFitting(QLabel& label, const QFont& font, const QString& text);
 
 /// The room for text in a list's or grid's row, beside its scroll bar.
 int RowTextWidth(const QAbstractScrollArea& list);

@@ -10,14 +10,13 @@
 #include <array>
 
 #include "dictionary/dictionary.h"
-#include "game/game_flow.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/platform.h"
 #include "results/result_lists.h"
 #include "results/results_window.h"
 #include "results/scoring.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 
@@ -47,7 +46,6 @@ void SortPlayersWords(const QTableWidget& entered, Results& results) {
 }
 
 void ListComputerWords(Results& results) {
-    constexpr int LongestWord = 16;
     results.DictWords->setUpdatesEnabled(false);
     for (std::int32_t i = 0; i < State.ComputerWordCount; ++i) {
         std::array<char, LongestWord> buffer{};
@@ -82,7 +80,7 @@ void EndGame() {
     State.TimeRemaining = 0;
     Main& window = Windows::Shared<Main>();
     CloseWordEntry(window);
-    SetTimeLabels("Game Over", QString());
+    window.SetTimeLabels("Game Over", QString());
     Results& results = Windows::Shared<Results>();
     SortPlayersWords(*window.WordList, results);
     ListComputerWords(results);

@@ -8,13 +8,13 @@
 
 #include "dictionary/dictionary.h"
 #include "entry/check_cubes.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
 #include "platform/platform.h"
 #include "results/end_of_game.h"
 #include "results/result_lists.h"
 #include "results/results_window.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 

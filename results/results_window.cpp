@@ -9,11 +9,11 @@
 #include <QStyleFactory>
 #include <QTimer>
 
-#include "game/windows.h"
 #include "platform/layout.h"
 #include "platform/list_keys.h"
 #include "results/result_lists.h"
 #include "results/results_commands.h"
+#include "state/windows.h"
 
 namespace {
 
@@ -30,9 +30,6 @@ QFont SummaryFont() {
 }
 QFont ArrowFont() {
     return LayoutFont(Typeface::SansSerif, 24);
-}
-QFont ListFont() {
-    return LayoutFont(Typeface::Courier, 18, true);
 }
 QFont CubeFont() {
     return LayoutFont(Typeface::Courier, 20.25, true);
@@ -99,12 +96,12 @@ void Results::makeLists() {
     UserWordsLabel->setText("Your Words");
     DictWordsLabel = MakeLabel(this, "DictWordsLabel", Pixels(400, 8, 209, 25), HeadingFont());
     DictWordsLabel->setText("Quorle's Words");
-    QFont struck = ListFont();
+    QFont struck = WordFont();
     struck.setStrikeOut(true);
-    UserWords = MakeList(this, "UserWords", "Your words", Pixels(16, 40, 209, 284), ListFont());
+    UserWords = MakeList(this, "UserWords", "Your words", Pixels(16, 40, 209, 284), WordFont());
     BadWords = MakeList(this, "BadWords", "Not in dictionary", Pixels(16, 328, 209, 85), struck);
     DictWords =
-        MakeList(this, "DictWords", "Quorle's words", Pixels(400, 40, 209, 372), ListFont());
+        MakeList(this, "DictWords", "Quorle's words", Pixels(400, 40, 209, 372), WordFont());
 }
 
 void Results::makeButtons() {

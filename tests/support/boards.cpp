@@ -5,7 +5,7 @@
 #include <random>
 #include <stdexcept>
 
-#include "game/game_state.h"
+#include "state/game_state.h"
 
 namespace {
 

@@ -9,7 +9,7 @@
 #include <vector>
 
 #include "engine/temp_folder.h"
-#include "game/game_state.h"
+#include "state/game_state.h"
 
 class GameFixture : public testing::Test {
   protected:

@@ -9,9 +9,11 @@
 #include <QTimerEvent>
 #include <stdexcept>
 
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "app/main_window_events.h"
+#include "app/shutdown.h"
+#include "main_window/main_window.h"
 #include "platform/platform.h"
+#include "state/windows.h"
 
 namespace {
 
@@ -36,7 +38,7 @@ ProgramFixture::~ProgramFixture() {
 }
 
 void ProgramFixture::endProgram() {
-    Windows::DestroyAll();
+    Common::DestroyWindows();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 }
 
@@ -49,7 +51,7 @@ void ProgramFixture::relaunch() {
 void ProgramFixture::launch() {
     Platform::UseDesktop();
     useTestDesktop();
-    Main& window = Windows::Shared<Main>();
+    Main& window = Common::LoadMainWindow();
     EXPECT_EQ(clock().interval(), 1000);
     clock().setInterval(3'600'000);
     window.show();

@@ -1,11 +1,11 @@
-#include "board/cube_tile.h"
+#include "main_window/cube_tile.h"
 
 #include <QAccessible>
 #include <QMouseEvent>
 #include <QPainter>
 #include <QVariant>
 
-#include "board/tile_picture.h"
+#include "main_window/tile_picture.h"
 
 namespace {
 

@@ -1,5 +1,5 @@
 // The four settings.
-#include "game/settings.h"
+#include "options/settings.h"
 
 #include <quorle/word_engine.h>
 

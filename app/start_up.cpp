@@ -1,4 +1,4 @@
-#include "game/start_up.h"
+#include "app/start_up.h"
 
 #include <quorle/word_engine.h>
 
@@ -7,11 +7,11 @@
 #include "board/dice.h"
 #include "board/draw_cubes.h"
 #include "dictionary/dictionary.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/settings.h"
-#include "game/windows.h"
+#include "main_window/main_window.h"
+#include "options/settings.h"
 #include "platform/platform.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace Common {
 
@@ -27,7 +27,7 @@ void StartUp() {
     }
     list.setColumnWidth(0, list.width());
     State.TimeRemaining = 0;
-    State.TimeLimit = 180;
+    State.TimeLimit = UsualGameTime;
     State.Paused = False;
     State.Sounds = True;
     LoadSettings();

@@ -5,13 +5,15 @@
 #include <QTimer>
 #include <chrono>
 
-#include "board/tile_picture.h"
-#include "game/main_window.h"
-#include "game/windows.h"
+#include "app/main_window_events.h"
+#include "app/shutdown.h"
+#include "main_window/main_window.h"
+#include "main_window/tile_picture.h"
 #include "platform/heap.h"
 #include "platform/legible_style.h"
 #include "platform/platform.h"
 #include "platform/session_end.h"
+#include "state/windows.h"
 
 namespace {
 
@@ -52,12 +54,12 @@ int main(int argc, char** argv) {
     QApplication::setDesktopFileName("quorle");
     // Hiding the last window shown must not end the program; closing Main does.
     QApplication::setQuitOnLastWindowClosed(false);
-    Main& window = Windows::Shared<Main>();
+    Main& window = Common::LoadMainWindow();
     CentreOnScreen(window);
     FollowSessionEnd([&window] { window.close(); });
     window.show();
     QTimer::singleShot(AfterFirstPaint, &window, FinishWindow);
     const int result = QApplication::exec();
-    Windows::DestroyAll();
+    Common::DestroyWindows();
     return result;
 }

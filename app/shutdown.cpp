@@ -1,4 +1,4 @@
-#include "game/shutdown.h"
+#include "app/shutdown.h"
 
 #include <quorle/word_engine.h>
 
@@ -6,14 +6,14 @@
 #include "dictionary/editor_window.h"
 #include "dictionary/merge.h"
 #include "dictionary/progress_window.h"
-#include "game/game_state.h"
-#include "game/main_window.h"
-#include "game/settings.h"
-#include "game/windows.h"
 #include "help/help_window.h"
+#include "main_window/main_window.h"
 #include "options/options_window.h"
+#include "options/settings.h"
 #include "platform/platform.h"
 #include "results/results_window.h"
+#include "state/game_state.h"
+#include "state/windows.h"
 
 namespace {
 
@@ -48,6 +48,15 @@ void ExitProgram() {
     CloseIfOpen<HelpBrowser>();
     CloseIfOpen<DictionaryEditor>();
     Windows::Shared<Main>().close();
+}
+
+void DestroyWindows() {
+    delete Windows::Existing<Results>;
+    delete Windows::Existing<Progress>;
+    delete Windows::Existing<DictionaryEditor>;
+    delete Windows::Existing<OptionsDialog>;
+    delete Windows::Existing<HelpBrowser>;
+    delete Windows::Existing<Main>;
 }
 
 }  // namespace Common

@@ -7,4 +7,7 @@ namespace Common {
 /// do the second time.
 void ExitProgram();
 
+/// Deletes every window, the main window last. Before the QApplication goes.
+void DestroyWindows();
+
 }  // namespace Common

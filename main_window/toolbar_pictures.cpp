@@ -1,4 +1,4 @@
-#include "game/toolbar_pictures.h"
+#include "main_window/toolbar_pictures.h"
 
 #include <QIconEngine>
 #include <QPainter>

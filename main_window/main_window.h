@@ -18,8 +18,8 @@ class Main : public QWidget {
   public:
     Main();
 
-    /// Runs the program's start-up; the window is not yet shown.
-    void load();
+    /// Captions of TimeRemLabel and TimeLeft.
+    void SetTimeLabels(const QString& caption, const QString& value);
 
     QWidget* ToolBar = nullptr;
     QToolButton* Start = nullptr;
@@ -42,6 +42,10 @@ class Main : public QWidget {
     QLabel* PlayerWordLabel = nullptr;
     QLabel* DefinedWordCount = nullptr;
     QTimer* GameClock = nullptr;
+
+  signals:
+    /// The window is about to close, whoever asked for it; the program ends with it.
+    void closing();
 
   protected:
     void closeEvent(QCloseEvent* event) override;

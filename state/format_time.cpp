@@ -1,4 +1,4 @@
-#include "game/format_time.h"
+#include "state/format_time.h"
 
 std::string FormatTime(std::int16_t seconds) {
     const int minutes = seconds / 60;

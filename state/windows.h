@@ -35,7 +35,4 @@ void Discard() {
     Existing<Window>.clear();
 }
 
-/// Deletes every window, the main window last. Before the QApplication goes.
-void DestroyAll();
-
 }  // namespace Windows

@@ -1,22 +1,17 @@
-#include "game/settings.h"
+#include "options/settings.h"
 
 #include <quorle/word_engine.h>
 
 #include <algorithm>
-#include <array>
 #include <charconv>
 
-#include "game/game_state.h"
+#include "dictionary/dictionary.h"
 #include "platform/platform.h"
+#include "state/game_state.h"
 
 namespace {
 
 constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
-constexpr std::array<std::int16_t, 7> GameTimes{15, 30, 60, 120, 180, 240, 300};
-constexpr std::int16_t DefaultTimeLimit = 180;
-constexpr std::int16_t SmallestWordSize = 2;
-constexpr std::int16_t LargestWordSize = 16;
-constexpr std::int16_t DefaultMinWordSize = 3;
 
 std::optional<std::string> ReadValue(const char* name) {
     std::string buffer = "1234567890";
@@ -36,7 +31,7 @@ void WriteValue(const char* name, const std::string& text) {
 }
 
 std::int16_t WordSizeOr(std::int16_t size, std::int16_t otherwise) {
-    return size >= SmallestWordSize && size <= LargestWordSize ? size : otherwise;
+    return size >= ShortestWord && size <= LongestWord ? size : otherwise;
 }
 
 }  // namespace
@@ -55,13 +50,13 @@ void LoadSettings() {
     if (const auto seconds = ReadNumber("TimeLimit")) {
         const bool offered =
             std::find(GameTimes.begin(), GameTimes.end(), *seconds) != GameTimes.end();
-        State.TimeLimit = offered ? *seconds : DefaultTimeLimit;
+        State.TimeLimit = offered ? *seconds : UsualGameTime;
     }
     if (const auto size = ReadNumber("MinWordSize")) {
-        cSetMinWordSize(WordSizeOr(*size, DefaultMinWordSize));
+        cSetMinWordSize(WordSizeOr(*size, UsualShortestWord));
     }
     if (const auto size = ReadNumber("MaxWordSize")) {
-        ReconcileMaxWordSize(WordSizeOr(*size, LargestWordSize));
+        ReconcileMaxWordSize(WordSizeOr(*size, LongestWord));
     }
     const auto sounds = ReadValue("Sounds");
     State.Sounds = ToBoolean(!sounds || *sounds == "1");
@@ -87,9 +82,7 @@ void ReconcileMaxWordSize(std::int16_t size) {
                                " letters, is it OK to remove the longer words from the dictionary?",
                            Platform::ProgramTitle);
     if (remove) {
-        cSetMaxWordSize(size);
-        cReduceWordSize();
-        State.DictionaryChanged = True;
+        Dictionary::ShortenDictionary(size);
     } else {
         Platform::ShowMessage(
             "Setting Max Word Size option to " + std::to_string(cMaxWordSize()) + " letters",

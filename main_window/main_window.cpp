@@ -1,4 +1,4 @@
-#include "game/main_window.h"
+#include "main_window/main_window.h"
 
 #include <QCloseEvent>
 #include <QCoreApplication>
@@ -11,18 +11,10 @@
 #include <QTimer>
 #include <QToolButton>
 
-#include "board/cube_tile.h"
-#include "board/tile_accessible.h"
-#include "board/tile_picture.h"
-#include "dictionary/editor_commands.h"
-#include "entry/submission.h"
-#include "entry/word_entry.h"
-#include "game/game_flow.h"
-#include "game/shutdown.h"
-#include "game/start_up.h"
-#include "game/toolbar_pictures.h"
-#include "help/help_commands.h"
-#include "options/options_commands.h"
+#include "main_window/cube_tile.h"
+#include "main_window/tile_accessible.h"
+#include "main_window/tile_picture.h"
+#include "main_window/toolbar_pictures.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
 #include "platform/window_accessible.h"
@@ -40,9 +32,6 @@ constexpr int TileSide = TileSize * TwipsPerPixel;
 constexpr int FirstTileTop = 240;
 constexpr int ClockInterval = 1000;
 
-QFont WordFont() {
-    return LayoutFont(Typeface::Courier, 18, true);
-}
 QFont MainFont() {
     return LayoutFont(Typeface::SansSerif, 18);
 }
@@ -71,11 +60,6 @@ Main::Main() {
     GameClock->setObjectName("GameClock");
     GameClock->setTimerType(Qt::PreciseTimer);
     GameClock->setInterval(ClockInterval);
-    connect(GameClock, &QTimer::timeout, this, [] { Common::ClockTick(); });
-}
-
-void Main::load() {
-    Common::StartUp();
 }
 
 void Main::makeToolBar() {
@@ -91,13 +75,6 @@ void Main::makeToolBar() {
     HelpButton->setText("?");  // drops the shortcut
     HelpButton->setShortcut(Qt::ALT | Qt::Key_H);
     HelpButton->setAccessibleName("Help");
-    connect(Start, &QToolButton::clicked, this, [] { Common::StartGame(); });
-    connect(Pause, &QToolButton::clicked, this, [] { Common::PauseGame(); });
-    connect(End, &QToolButton::clicked, this, [] { Common::StopGame(); });
-    connect(Options, &QToolButton::clicked, this, [] { Common::ShowOptions(); });
-    connect(Dictionary, &QToolButton::clicked, this, [] { ::Dictionary::OpenEditor(); });
-    connect(HelpButton, &QToolButton::clicked, this, [] { Common::OpenHelp(); });
-    connect(Exit, &QToolButton::clicked, this, [] { Common::ExitProgram(); });
 }
 
 QToolButton* Main::makeToolButton(const char* name, int left, const char* toolTip, Qt::Key altKey) {
@@ -132,10 +109,6 @@ void Main::makeBoard() {
               {TilePitch * (k % 4), FirstTileTop + TilePitch * (k / 4), TileSide, TileSide},
               LayoutFont(Typeface::Courier, 48));
         tile->setAccessibleDescription(QString("Row %1, column %2").arg(k / 4 + 1).arg(k % 4 + 1));
-        connect(tile, &CubeTile::clicked, this,
-                [k] { Common::CubeClick(static_cast<std::int16_t>(k)); });
-        connect(tile, &CubeTile::doubleClicked, this,
-                [k] { Common::CubeDoubleClick(static_cast<std::int16_t>(k)); });
         Cube[static_cast<std::size_t>(k)] = tile;
     }
 }
@@ -145,18 +118,15 @@ void Main::makeWordEntry() {
     SetUp(NewWord, "NewWord", {120, 6960, 3735, 615}, WordFont());
     NewWord->setEnabled(false);
     NewWord->setAccessibleName("New word");
-    connect(NewWord, &QLineEdit::textChanged, this, [] { Common::WordTyped(); });
 
     Enter = new QPushButton("Enter", this);
     SetUp(Enter, "Enter", {3960, 6960, 975, 615}, SmallerFont());
     Enter->setFocusPolicy(Qt::TabFocus);
-    connect(Enter, &QPushButton::clicked, this, [] { Common::Submit(); });
 
     Clear = new QPushButton("Clear", this);
     SetUp(Clear, "Clear", {5040, 6960, 855, 615}, SmallerFont());
     Clear->setFocusPolicy(Qt::TabFocus);
     Clear->setShortcut(Qt::ALT | Qt::Key_C);
-    connect(Clear, &QPushButton::clicked, this, [] { Common::ClearLetter(); });
 }
 
 void Main::makeLabels() {
@@ -182,9 +152,14 @@ void Main::makeWordList() {
     WordList->setShowGrid(false);
 }
 
+void Main::SetTimeLabels(const QString& caption, const QString& value) {
+    TimeRemLabel->setText(caption);
+    TimeLeft->setText(value);
+}
+
 // A running game is dropped; the window manager, Alt+F4 and Exit all come here.
 void Main::closeEvent(QCloseEvent* event) {
-    Common::ExitProgram();
+    emit closing();
     event->accept();
     QCoreApplication::quit();
 }

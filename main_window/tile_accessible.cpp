@@ -1,8 +1,8 @@
-#include "board/tile_accessible.h"
+#include "main_window/tile_accessible.h"
 
 #include <QAccessibleWidget>
 
-#include "board/cube_tile.h"
+#include "main_window/cube_tile.h"
 
 namespace {
 

@@ -4,6 +4,8 @@
 #include <cstdint>
 #include <string>
 
+#include "state/game_rules.h"
+
 /// A 16-bit truth value, true being all bits set. ToBoolean makes one of a
 /// bool, which would otherwise be stored as 1.
 enum Boolean : std::int16_t { False = 0, True = -1 };
@@ -15,6 +17,9 @@ constexpr int BoardSize = 4;     ///< rows and columns of the board
 constexpr int CubeCount = 16;    ///< board index = 4 x row + column
 constexpr int PickedSlots = 17;  ///< slots 1..17 of PickedCubes
 
+/// A mark for each cell of the board: [row][column], of which 0..3 are used.
+using BoardMarks = std::array<std::array<Boolean, BoardSize + 1>, BoardSize + 1>;
+
 struct GameState {
     // The running game.
     std::int16_t TimeRemaining = 0;  ///< seconds; not 0 while a game is under way
@@ -23,7 +28,7 @@ struct GameState {
     std::int32_t ComputerWordCount = 0;
 
     // Settings. The shortest and longest word are the word engine's.
-    std::int16_t TimeLimit = 180;  ///< seconds
+    std::int16_t TimeLimit = UsualGameTime;  ///< seconds
     Boolean Sounds = True;
     std::int16_t MaxWordSizeOption = 0;  ///< as settled at start-up
 
@@ -31,8 +36,7 @@ struct GameState {
     std::array<std::string, CubeCount> CubeFaces;        ///< six upper-case letters each
     std::array<std::string, CubeCount + 1> CubeLetters;  ///< "R", "Qu", or empty when blank
     std::array<std::array<std::string, BoardSize + 1>, BoardSize + 1> BoardGrid;  ///< "r", "qu"
-    std::array<std::array<Boolean, BoardSize + 1>, BoardSize + 1>
-        TracedPath{};  ///< the chain found
+    BoardMarks TracedPath{};  ///< the chain found
     std::array<std::int16_t, CubeCount + 1>
         CubeDrawState{};  ///< 0 never drawn, 1 normal, 2 selected
 

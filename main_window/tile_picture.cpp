@@ -1,4 +1,4 @@
-#include "board/tile_picture.h"
+#include "main_window/tile_picture.h"
 
 #include <QHash>
 #include <QImage>
