@@ -22,7 +22,7 @@ class Shortest : public benchmark::BenchmarkReporter {
     bool ReportContext(const Context&) override { return true; }
     void ReportRuns(const std::vector<Run>& runs) override {
         for (const Run& run : runs) {
-            if (run.run_type != Run::RT_Iteration || run.error_occurred) continue;
+            if (run.run_type != Run::RT_Iteration) continue;
             const bool byClock = !run.run_name.time_type.empty();
             const double time = byClock ? run.GetAdjustedRealTime() : run.GetAdjustedCPUTime();
             const auto [known, isNew] = times_.emplace(run.run_name.function_name, time);

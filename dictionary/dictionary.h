@@ -9,7 +9,8 @@ namespace Dictionary {
 /// The path of Dictionary.dat.
 std::string FilePath();
 
-/// Loads Dictionary.dat; where that fails, the engine's dictionary stays empty.
+/// Loads Dictionary.dat; where that fails, the engine keeps what it holds: nothing, or the
+/// installed words where a copy of them could not be written.
 void LoadDictionary();
 
 /// Saves Dictionary.dat.

@@ -9,7 +9,9 @@ import time
 
 import pyatspi
 
-WORD_LISTS = ("/usr/share/dict/american-english-large", "/usr/share/dict/british-english-large")
+WORD_LISTS = [f"/usr/share/dict/scowl/{spelling}-words.{size}"
+              for spelling in ("english", "american", "british")
+              for size in (10, 20, 35, 40, 50, 55, 60, 70)]
 
 
 def wait_for(what, condition, seconds=20):
@@ -62,7 +64,7 @@ def traced_words(letters, length):
 
 
 def listed_words():
-    return {line.strip() for path in WORD_LISTS for line in open(path, encoding="utf-8")}
+    return {line.strip() for path in WORD_LISTS for line in open(path, encoding="latin-1")}
 
 
 class Program:

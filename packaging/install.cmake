@@ -1,7 +1,8 @@
 # Where everything goes under the prefix. The engine is private to the program,
 # which finds it relative to itself, so that an installed tree can be moved.
 set(QUORLE_COMPONENT_ID io.github.quorle.quorle CACHE STRING "AppStream id of the program")
-set(QUORLE_BASE_ADDRESS "" CACHE STRING "Web address of the project; empty: none is named")
+set(QUORLE_HOME_PAGE https://quorle.github.io CACHE STRING "Web address of the project")
+set(QUORLE_BASE_ADDRESS "" CACHE STRING "Web address of the sources; empty: no pictures are named")
 set(QUORLE_RELEASE_DATE 2026-11-25)
 
 set(games games)
@@ -21,13 +22,19 @@ add_dependencies(quorle program_folder)
 if(QUORLE_BASE_ADDRESS)
   set(pictures ${QUORLE_BASE_ADDRESS}/packaging/pictures)
   string(CONFIGURE [[
-  <url type="homepage">@QUORLE_BASE_ADDRESS@</url>
   <screenshots>
     <screenshot type="default"><image>@pictures@/board.png</image></screenshot>
     <screenshot><image>@pictures@/results.png</image></screenshot>
     <screenshot><image>@pictures@/editor.png</image></screenshot>
   </screenshots>
 ]] QUORLE_WEB_ELEMENTS @ONLY)
+endif()
+# AppStream 1.0 gave the developer another element, which earlier versions refuse.
+set(QUORLE_DEVELOPER [[<developer id="io.github.quorle"><name>Quorle developers</name></developer>]])
+execute_process(COMMAND appstreamcli --version OUTPUT_VARIABLE appstream_version
+  RESULT_VARIABLE no_appstream ERROR_QUIET)
+if(NOT no_appstream AND appstream_version MATCHES " 0\\.")
+  set(QUORLE_DEVELOPER "<developer_name>Quorle developers</developer_name>")
 endif()
 set(metainfo ${made}/${QUORLE_COMPONENT_ID}.metainfo.xml)
 configure_file(${sources}/quorle.metainfo.xml.in ${metainfo} @ONLY)
@@ -44,7 +51,8 @@ endforeach()
 
 install(TARGETS quorle RUNTIME DESTINATION ${games})
 install(TARGETS Quorle LIBRARY DESTINATION ${library})
-install(FILES ${QUORLE_DICTIONARY} ${PROJECT_SOURCE_DIR}/help/Quorle.htm
+install(FILES ${QUORLE_DICTIONARY}
+  ${PROJECT_SOURCE_DIR}/help/Quorle.htm ${PROJECT_SOURCE_DIR}/help/Quorle.png
   DESTINATION ${share}/quorle)
 install(FILES ${sources}/quorle.desktop DESTINATION ${share}/applications)
 install(FILES ${metainfo} DESTINATION ${share}/metainfo)

@@ -1,7 +1,7 @@
 # The Debian packages that building, playing and testing need; for ./play and ./check.
 
 PLAY_PACKAGES=(cmake ninja-build g++ pkgconf qt6-base-dev libcanberra-dev libcanberra-pulse
-    sound-theme-freedesktop fonts-liberation wamerican-large wbritish-large)
+    sound-theme-freedesktop fonts-liberation scowl)
 
 CHECK_PACKAGES=("${PLAY_PACKAGES[@]}" clang-format libgtest-dev libbenchmark-dev libmarisa-dev
     dpkg-dev file lintian appstream desktop-file-utils mandoc

@@ -2,6 +2,7 @@
 
 #include <quorle/word_engine.h>
 
+#include <array>
 #include <cstdlib>
 #include <filesystem>
 #include <system_error>
@@ -11,7 +12,7 @@ namespace fs = std::filesystem;
 namespace {
 
 constexpr const char* DictionaryName = "Dictionary.dat";
-constexpr const char* HelpName = "Quorle.htm";
+constexpr std::array HelpNames{"Quorle.htm", "Quorle.png"};
 
 fs::path ExecutableFolder() {
     std::error_code error;
@@ -33,12 +34,12 @@ void CopyDictionary(const fs::path& from, const fs::path& to) {
     if (cReadBinaryDictionary(from.c_str()) == 1) cWriteBinaryDictionary(to.c_str());
 }
 
-void LinkHelpPage(const fs::path& page, const fs::path& link) {
+void LinkHelp(const fs::path& file, const fs::path& link) {
     std::error_code error;
-    if (fs::is_symlink(link, error) && fs::read_symlink(link, error) != page) {
+    if (fs::is_symlink(link, error) && fs::read_symlink(link, error) != file) {
         fs::remove(link, error);
     }
-    fs::create_symlink(page, link, error);
+    fs::create_symlink(file, link, error);
 }
 
 void Furnish(const fs::path& folder, const fs::path& shared) {
@@ -47,7 +48,7 @@ void Furnish(const fs::path& folder, const fs::path& shared) {
         fs::permissions(folder, fs::perms::owner_all, error);
     }
     CopyDictionary(shared / DictionaryName, folder / DictionaryName);
-    LinkHelpPage(shared / HelpName, folder / HelpName);
+    for (const char* name : HelpNames) LinkHelp(shared / name, folder / name);
 }
 
 }  // namespace

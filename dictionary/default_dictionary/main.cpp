@@ -19,7 +19,7 @@ bool IsWord(const std::string& line) {
            std::all_of(line.begin(), line.end(), [](char c) { return c >= 'a' && c <= 'z'; });
 }
 
-// The lists hold some two hundred abbreviations ("blvd", "kg"); having no vowel tells them.
+// The lists hold a few signs of units ("kb", "lm"); having no vowel tells them.
 bool HasVowel(const std::string& word) {
     return word.find_first_of("aeiouy") != std::string::npos;
 }

@@ -1,3 +1,5 @@
+#include <QAbstractTextDocumentLayout>
+#include <QTextBlock>
 #include <QTextBrowser>
 
 #include "support/program_fixture.h"
@@ -43,6 +45,22 @@ TEST_F(Help, WalksThroughTheHistoryThatTheTitleBarDrops) {
     closeByTitleBar("HelpBrowser");
     press("HelpButton");
     EXPECT_EQ(after("Back"), "Quorle.htm");
+}
+
+TEST_F(Help, ThePageShipsWithItsPicture) {
+    closeByTitleBar("HelpBrowser");
+    for (const char* file : {"Quorle.htm", "Quorle.png"}) {
+        std::filesystem::copy_file(std::string(QUORLE_HELP) + file,
+                                   folder_ / (std::string("program/") + file),
+                                   std::filesystem::copy_options::overwrite_existing);
+    }
+    press("HelpButton");
+    const QTextDocument& page = *viewer().document();
+    qreal tallest = 0;
+    for (QTextBlock block = page.begin(); block.isValid(); block = block.next()) {
+        tallest = std::max(tallest, page.documentLayout()->blockBoundingRect(block).height());
+    }
+    EXPECT_GE(tallest, QImage(QUORLE_HELP "Quorle.png").height());
 }
 
 TEST_F(Help, AMissingPageIsToldInItsPlaceAlone) {
