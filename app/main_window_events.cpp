@@ -2,6 +2,7 @@
 
 #include <QLineEdit>
 #include <QPushButton>
+#include <QShortcut>
 #include <QTimer>
 #include <QToolButton>
 
@@ -11,6 +12,7 @@
 #include "entry/submission.h"
 #include "entry/word_entry.h"
 #include "game/game_flow.h"
+#include "game/tell_game.h"
 #include "help/help_commands.h"
 #include "main_window/cube_tile.h"
 #include "main_window/main_window.h"
@@ -40,6 +42,7 @@ void ConnectEvents(const Main& window) {
     on(window.Enter, &QPushButton::clicked, Common::Submit);
     on(window.Clear, &QPushButton::clicked, Common::ClearLetter);
     on(window.GameClock, &QTimer::timeout, Common::ClockTick);
+    on(window.TellKey, &QShortcut::activated, Common::TellGame);
     on(&window, &Main::closing, Common::ExitProgram);
     for (std::int16_t k = 0; k < CubeCount; ++k) {
         ConnectTile(*window.Cube[static_cast<std::size_t>(k)], k);

@@ -2,6 +2,7 @@
 
 #include <quorle/word_engine.h>
 
+#include <QLabel>
 #include <QLineEdit>
 #include <QListView>
 #include <QPushButton>
@@ -38,6 +39,11 @@ void Refresh(Boolean ResetSelection) {
     Dictionary::ListWords();
 }
 
+void TellChange(const QString& word, const char* what) {
+    const QLabel& count = *Windows::Shared<DictionaryEditor>().WordCount;
+    Platform::Tell(QString("%1 %2. %3").arg(word, what, count.text()).toStdString());
+}
+
 }  // namespace
 
 namespace Dictionary {
@@ -64,17 +70,21 @@ void AddNewWord() {
     AddToDictionary(word.toStdString());
     box.clear();
     Refresh(False);
+    TellChange(word, IsInDictionary(word.toStdString()) ? "added" : "not added, it is too long");
 }
 
 void RemoveSelectedWord() {
     const QListView& list = *Windows::Shared<DictionaryEditor>().WordList;
     const auto selected = list.selectionModel()->selectedIndexes();
+    QString removed;
     if (selected.isEmpty()) {
         Platform::ShowMessage("You must select a word to remove.", Platform::ProgramTitle);
     } else {
-        RemoveFromDictionary(selected.first().data().toString().toStdString());
+        removed = selected.first().data().toString();
+        RemoveFromDictionary(removed.toStdString());
     }
     Refresh(False);
+    if (!removed.isEmpty()) TellChange(removed, "removed");
 }
 
 void ClearDictionary() {

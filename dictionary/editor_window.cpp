@@ -16,6 +16,7 @@
 #include "platform/layout.h"
 #include "platform/list_keys.h"
 #include "platform/menu_bar.h"
+#include "platform/screen_reader.h"
 #include "state/game_rules.h"
 #include "state/windows.h"
 
@@ -78,7 +79,7 @@ void DictionaryEditor::makeMenu() {
 void DictionaryEditor::makeLists() {
     StartingLetters = new QComboBox(client_);
     SetUp(StartingLetters, "StartingLetters", {120, 120, 3855, 540}, WordFont());
-    StartingLetters->setAccessibleDescription("Starting letters");  // its name is its entry
+    ScreenReader::TellValueOf(StartingLetters, "Starting letters");
     StartingLetters->setMaxVisibleItems(PrefixesInView);
     connect(StartingLetters, &QComboBox::currentIndexChanged, this,
             [] { Dictionary::ListWords(); });

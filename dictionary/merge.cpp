@@ -3,6 +3,7 @@
 #include <quorle/word_engine.h>
 
 #include <QLabel>
+#include <QLineEdit>
 #include <QTimer>
 
 #include "dictionary/editor_window.h"
@@ -36,6 +37,13 @@ void ShowProgressWindow(Progress& window) {
     }
 }
 
+// A screen reader starts where the next word would be typed.
+void TellMerged() {
+    const DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
+    editor.NewWord->setFocus();
+    Platform::Tell("merged. " + editor.WordCount->text().toStdString());
+}
+
 void FinishMerge(Progress& window) {
     SetBarWidth(*window.ProgressIndicator, 0);
     Dictionary::ListStartingLetters(True);
@@ -43,6 +51,7 @@ void FinishMerge(Progress& window) {
     Dictionary::ShowEditor();
     Dictionary::ListWords();
     State.DictionaryChanged = True;
+    TellMerged();
 }
 
 }  // namespace
@@ -57,10 +66,12 @@ void StartMerge() {
         ListStartingLetters(True);
         ListWords();
         State.DictionaryChanged = True;
+        TellMerged();
         return;
     }
     WindowFront::Hide(Windows::Shared<DictionaryEditor>());
     Progress& window = Windows::Shared<Progress>();
+    Platform::Tell("merging");
     ShowProgressWindow(window);
     ShowProgress(window, percent);
     window.DictionaryTimer->start();

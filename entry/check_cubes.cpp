@@ -18,8 +18,8 @@ bool IsLastUnit(std::string_view rest) {
     return rest.size() == 1 || rest == Qu;
 }
 
-bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view rest,
-               BoardMarks& path) {
+bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view rest, BoardMarks& path,
+               std::vector<std::size_t>& backwards) {
     const std::string_view unit = LetterUnit(rest);
     const std::size_t lastRow = std::min<std::size_t>(fromRow + 1, BoardSize - 1);
     const std::size_t lastColumn = std::min<std::size_t>(fromColumn + 1, BoardSize - 1);
@@ -29,7 +29,9 @@ bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view res
             Boolean& mark = path[row][column];
             if (mark || State.BoardGrid[row][column] != unit) continue;
             mark = True;
-            if (IsLastUnit(rest) || TraceFrom(row, column, rest.substr(unit.size()), path)) {
+            if (IsLastUnit(rest) ||
+                TraceFrom(row, column, rest.substr(unit.size()), path, backwards)) {
+                backwards.push_back(BoardSize * row + column);
                 return true;
             }
             mark = False;
@@ -43,26 +45,39 @@ bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view res
 namespace CheckCubes {
 
 Trace TraceWord(std::string_view word) {
-    if (word.empty()) return {True, BoardMarks{}};
+    if (word.empty()) return {True, BoardMarks{}, {}};
     std::optional<BoardMarks> path;
+    std::vector<std::size_t> backwards;
     const std::string_view unit = LetterUnit(word);
     for (std::size_t row = 0; row < BoardSize; ++row) {
         for (std::size_t column = 0; column < BoardSize; ++column) {
             if (State.BoardGrid[row][column] != unit) continue;
             path.emplace();
             (*path)[row][column] = True;
-            if (IsLastUnit(word) || TraceFrom(row, column, word.substr(unit.size()), *path)) {
-                return {True, path};
+            if (IsLastUnit(word) ||
+                TraceFrom(row, column, word.substr(unit.size()), *path, backwards)) {
+                backwards.push_back(BoardSize * row + column);
+                return {True, path, {backwards.rbegin(), backwards.rend()}};
             }
         }
     }
-    return {False, path};
+    return {False, path, {}};
 }
 
 Boolean IsOnBoard(std::string_view word) {
     const Trace trace = TraceWord(word);
     if (trace.path) State.TracedPath = *trace.path;
     return trace.found;
+}
+
+std::string Places(std::string_view word) {
+    std::string places;
+    for (const std::size_t cube : TraceWord(word).chain) {
+        if (!places.empty()) places += ", ";
+        places += "row " + std::to_string(cube / BoardSize + 1) + " column " +
+                  std::to_string(cube % BoardSize + 1);
+    }
+    return places;
 }
 
 // No chain spells more than its cubes can, so a long paste is cut to that first.

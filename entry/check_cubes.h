@@ -2,7 +2,9 @@
 // The one judge of whether a word lies on the board.
 #include <cstddef>
 #include <optional>
+#include <string>
 #include <string_view>
+#include <vector>
 
 #include "state/game_state.h"
 
@@ -11,6 +13,7 @@ namespace CheckCubes {
 struct Trace {
     Boolean found;
     std::optional<BoardMarks> path;
+    std::vector<std::size_t> chain;  ///< the path's board indexes in the word's order
 };
 
 /// Whether `word` lies on the board along a chain of touching cubes, none used twice,
@@ -26,5 +29,9 @@ Boolean IsOnBoard(std::string_view word);
 /// The number of bytes, from the front, of the longest beginning of `text` that
 /// is on the board. TracedPath is left as IsOnBoard leaves it for that beginning.
 std::size_t LongestOnBoard(std::string_view text);
+
+/// Where the cubes of a word lie, in its order: "row 1 column 2, row 1 column 3"; empty
+/// when it is not on the board.
+std::string Places(std::string_view word);
 
 }  // namespace CheckCubes

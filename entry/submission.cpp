@@ -5,6 +5,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QSignalBlocker>
 #include <QTableWidget>
 
 #include "board/draw_cubes.h"
@@ -14,6 +15,7 @@
 #include "entry/word_entry.h"
 #include "main_window/main_window.h"
 #include "platform/layout.h"
+#include "platform/platform.h"
 #include "state/game_state.h"
 #include "state/windows.h"
 
@@ -32,18 +34,25 @@ void ListWord(Main& window, const std::string& word) {
     list.insertRow(0);
     auto* cell = new QTableWidgetItem(text);
     QFont font = Condensed(WordFont(), text, RowTextWidth(list));
-    if (!Dictionary::IsInDictionary(word)) {
+    const bool known = Dictionary::IsInDictionary(word);
+    if (!known) {
         font.setStrikeOut(true);
         cell->setData(Qt::AccessibleDescriptionRole, "not in dictionary");
         Common::PlayWarning();
     }
     cell->setFont(font);
     list.setItem(0, 0, cell);
-    list.setCurrentCell(0, 0, QItemSelectionModel::NoUpdate);
+    {
+        // A screen reader would follow the current cell away from the text box.
+        const QSignalBlocker quiet(list.selectionModel());
+        list.setCurrentCell(0, 0, QItemSelectionModel::NoUpdate);
+    }
     list.scrollToTop();
     const int count = list.rowCount();
     window.PlayerWordLabel->setText(count == 1 ? QString("1 word entered")
                                                : QString("%1 words entered").arg(count));
+    Platform::Tell((known ? "right. " : "not in dictionary. ") +
+                   window.PlayerWordLabel->text().toStdString());
 }
 
 void EmptyNewWord(Main& window) {
@@ -62,13 +71,15 @@ void Submit() {
     State.PickedWord.clear();
     State.PickedCount = 0;
     const auto length = static_cast<std::int32_t>(word.size());
-    if (length < cMinWordSize()) return;
+    if (length < cMinWordSize()) return Platform::Tell("too short");
     if (length > cMaxWordSize()) {
+        Platform::Tell("too long");
         EmptyNewWord(window);
         return;
     }
     if (CheckCubes::IsOnBoard(word)) {
         if (IsEntered(*window.WordList, QString::fromStdString(word))) {
+            Platform::Tell("already listed");
             EmptyNewWord(window);
             return;
         }

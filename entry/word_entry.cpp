@@ -60,6 +60,11 @@ void UndoPick(const std::string& shorter) {
     --State.PickedCount;
 }
 
+// What is taken off a word, be it many letters of a paste.
+void TellTakenOff(const std::string& letters) {
+    Platform::Tell(letters + " taken off");
+}
+
 }  // namespace
 
 namespace Common {
@@ -76,7 +81,10 @@ void WordTyped() {
     const TypedCut cut = CutToBoard(text);
     if (!cut.traced) return;
     for (std::size_t i = 0; i < cut.takenOff; ++i) PlayWarning();
-    if (cut.takenOff > 0) SetText(text.substr(0, cut.kept));
+    if (cut.takenOff > 0) {
+        SetText(text.substr(0, cut.kept));
+        TellTakenOff(text.substr(cut.kept));
+    }
     DrawTracedPath();
 }
 
@@ -112,6 +120,7 @@ void ClearLetter() {
     } else if (!text.empty()) {
         ForgetPicks();
     }
+    if (!text.empty()) TellTakenOff(text.substr(shorter.size()));
     SetText(shorter);
 }
 

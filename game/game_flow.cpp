@@ -10,6 +10,7 @@
 
 #include "board/dice.h"
 #include "board/draw_cubes.h"
+#include "game/tell_game.h"
 #include "main_window/main_window.h"
 #include "platform/layout.h"
 #include "platform/platform.h"
@@ -72,6 +73,7 @@ void StartGame() {
     State.TimeRemaining = State.TimeLimit;
     window.SetTimeLabels("Time Remaining", TimeText(State.TimeLimit));
     window.GameClock->start();
+    TellNewBoard();
 }
 
 void PauseGame() {
@@ -86,14 +88,15 @@ void PauseGame() {
 
 void StopGame() {
     State.TimeRemaining = 0;
-    EndGame();
+    EndGame("Game over");
 }
 
 void ClockTick() {
     if (State.Paused || !ClockMayCount()) return;
     --State.TimeRemaining;
     Windows::Shared<Main>().TimeLeft->setText(TimeText(State.TimeRemaining));
-    if (State.TimeRemaining == 0) EndGame();
+    TellTimeLeft();
+    if (State.TimeRemaining == 0) EndGame("Time is up");
 }
 
 }  // namespace Common

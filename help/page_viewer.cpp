@@ -1,8 +1,12 @@
 #include "help/page_viewer.h"
 
+#include <QAccessible>
 #include <QEvent>
 #include <QFile>
 #include <QScrollBar>
+#include <QTextCursor>
+
+#include "platform/platform.h"
 
 namespace {
 
@@ -19,12 +23,26 @@ PageViewer::PageViewer(QWidget* parent) : QTextBrowser(parent) {
     setOpenExternalLinks(true);
     document()->setDocumentMargin(Margin);
     setLinkColour();
+    // A screen reader reads by the caret's lines; without one the arrow keys scroll.
+    if (QAccessible::isActive()) {
+        setTextInteractionFlags(textInteractionFlags() | Qt::TextSelectableByKeyboard);
+    }
 }
 
 QVariant PageViewer::loadResource(int type, const QUrl& name) {
     QVariant content = QTextBrowser::loadResource(type, name);
     if (type != QTextDocument::HtmlResource || !content.toByteArray().isEmpty()) return content;
     return NotFoundPage(name.isLocalFile() ? name.toLocalFile() : name.toString());
+}
+
+// Tab selects the next link.
+bool PageViewer::focusNextPrevChild(bool next) {
+    const bool stayed = QTextBrowser::focusNextPrevChild(next);
+    const QTextCursor link = textCursor();
+    if (stayed && link.hasSelection()) {
+        Platform::Tell("link " + link.selectedText().toStdString());
+    }
+    return stayed;
 }
 
 // Links take the application's link colour, which many dark palettes leave at a

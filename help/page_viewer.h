@@ -13,6 +13,7 @@ class PageViewer : public QTextBrowser {
 
   protected:
     void changeEvent(QEvent* event) override;
+    bool focusNextPrevChild(bool next) override;
 
   private:
     void setLinkColour();

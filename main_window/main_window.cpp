@@ -7,6 +7,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QShortcut>
 #include <QTableWidget>
 #include <QTimer>
 #include <QToolButton>
@@ -55,6 +56,8 @@ Main::Main() {
     makeWordList();
     setPictures();
     SetDefaultButton(this, Enter);
+    // A key that text boxes, desktops and screen readers leave alone.
+    TellKey = new QShortcut(Qt::Key_F2, this);
 
     GameClock = new QTimer(this);
     GameClock->setObjectName("GameClock");

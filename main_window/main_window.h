@@ -7,6 +7,7 @@ class QFrame;
 class QLabel;
 class QLineEdit;
 class QPushButton;
+class QShortcut;
 class QTableWidget;
 class QTimer;
 class QToolButton;
@@ -42,6 +43,7 @@ class Main : public QWidget {
     QLabel* PlayerWordLabel = nullptr;
     QLabel* DefinedWordCount = nullptr;
     QTimer* GameClock = nullptr;
+    QShortcut* TellKey = nullptr;  ///< asks a screen reader for time, words and board
 
   signals:
     /// The window is about to close, whoever asked for it; the program ends with it.

@@ -11,6 +11,7 @@
 
 #include "options/options_commands.h"
 #include "platform/layout.h"
+#include "platform/screen_reader.h"
 
 namespace {
 
@@ -87,6 +88,9 @@ void OptionsDialog::makeBoxes() {
                                "Shortest word allowed in a game");
     WordSizeCombo = MakeBox(this, "WordSizeCombo", Pixels(144, 88, 137, 21),
                             "Largest word stored in dictionary and allowed in game");
+    for (QComboBox* box : {MinWordSizeCombo, WordSizeCombo}) {
+        ScreenReader::TellValueOf(box, box->toolTip());
+    }
     SoundsOption = new QCheckBox(this);
     SetUp(SoundsOption, "SoundsOption", Pixels(144, 128, 17, 25), PlainFont());
     SoundsOption->setToolTip("Controls game sounds");

@@ -70,8 +70,10 @@ def listed_words():
 class Program:
     """A running Quorle, its windows enlarged by `scale`."""
 
-    def __init__(self, executable, scale=1):
-        environment = {"QT_LINUX_ACCESSIBILITY_ALWAYS_ON": "1", "QT_SCALE_FACTOR": str(scale)}
+    def __init__(self, executable, scale=1, always_on=True):
+        environment = {"QT_SCALE_FACTOR": str(scale)}
+        if always_on:
+            environment["QT_LINUX_ACCESSIBILITY_ALWAYS_ON"] = "1"
         self.scale = scale
         self.output = tempfile.TemporaryFile("w+")
         self.process = subprocess.Popen([executable], env={**os.environ, **environment},

@@ -3,6 +3,7 @@
 #include "platform/message_box.h"
 #include "platform/platform.h"
 #include "platform/program_folder.h"
+#include "platform/screen_reader.h"
 #include "platform/warning_sound.h"
 #include "platform/window_front.h"
 
@@ -14,6 +15,7 @@ void UseDesktop() {
     ChooseFileToOpen = FileDialog::ChooseToOpen;
     ChooseFileToSave = FileDialog::ChooseToSave;
     WarningSound = WarningSound::Play;
+    Tell = ScreenReader::Tell;
     WindowInFront = WindowFront::Number;
     ProgramFolder = [folder = FindProgramFolder()] { return folder; };
 }

@@ -43,6 +43,7 @@ std::function<std::string(const std::string&)> ChooseFileToSave = [](const std::
     return std::string();
 };
 std::function<void()> WarningSound = [] {};
+std::function<void(const std::string&)> Tell = [](const std::string&) {};
 std::function<std::int32_t()> WindowInFront = [] { return 0; };
 std::function<void()> SeedRandom = SeedFromTimeOfDay;
 std::function<float()> RandomNumber = DrawNumber;

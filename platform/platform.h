@@ -25,6 +25,9 @@ extern std::function<std::string(const std::string& folder)> ChooseFileToSave;
 /// Plays the warning sound; never waits for it.
 extern std::function<void()> WarningSound;
 
+/// Has a screen reader say a text, wherever the focus is; nothing where none is active.
+extern std::function<void(const std::string& text)> Tell;
+
 /// The number of our window in front: 1 for the main window, others above, 0
 /// when none is; negative while a message or file dialog of that window is.
 extern std::function<std::int32_t()> WindowInFront;

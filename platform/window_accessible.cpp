@@ -1,6 +1,7 @@
 #include "platform/window_accessible.h"
 
 #include <QAccessibleWidget>
+#include <QKeySequence>
 #include <QToolButton>
 
 namespace {
@@ -13,6 +14,12 @@ class ToolButtonAccessible : public QAccessibleWidget {
         : QAccessibleWidget(button, QAccessible::Button), button_(button) {}
 
     QStringList actionNames() const override { return {pressAction(), setFocusAction()}; }
+
+    QStringList keyBindingsForAction(const QString& name) const override {
+        if (name != pressAction()) return {};
+        // Mnemonic, path in menus, accelerator: readers tell these apart by their places.
+        return {"", "", button_->shortcut().toString(QKeySequence::NativeText)};
+    }
 
     void doAction(const QString& name) override {
         if (name != pressAction()) return QAccessibleWidget::doAction(name);

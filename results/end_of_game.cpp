@@ -5,6 +5,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
+#include <QPushButton>
 #include <QTableWidget>
 #include <QTimer>
 #include <array>
@@ -76,7 +77,7 @@ void SolveBoard() {
     State.ComputerWordCount = cCheckForAllDefinedWords(BoardString().c_str());
 }
 
-void EndGame() {
+void EndGame(const char* why) {
     State.TimeRemaining = 0;
     Main& window = Windows::Shared<Main>();
     CloseWordEntry(window);
@@ -87,8 +88,16 @@ void EndGame() {
     State.ResultsShownAt = Platform::SteadySeconds();
     ShowResultBoard(results);
     results.placeBeside(window);
+    results.ResultsOK->setAccessibleDescription(why + (". " + SummaryText()));
+    results.ResultsOK->setFocus();
     WindowFront::Bring(results);
     UpdateResultLabels();
+}
+
+QString SummaryText() {
+    const Results& results = Windows::Shared<Results>();
+    return results.WordsLabel->text() + ". " + results.ScoreLabel->text() + ". " +
+           results.BadWordsLabel->text();
 }
 
 void UpdateResultLabels() {

@@ -1,5 +1,6 @@
 #pragma once
 // The computer's side of a game, and its end.
+#include <QString>
 
 namespace Common {
 
@@ -7,8 +8,11 @@ namespace Common {
 void SolveBoard();
 
 /// Ends the game and shows its results; what the results window still holds of
-/// an earlier game stays.
-void EndGame();
+/// an earlier game stays. A screen reader says why before it reads the results.
+void EndGame(const char* why);
+
+/// The three summary lines in one.
+QString SummaryText();
 
 /// Rewrites the three summary lines from the three lists.
 void UpdateResultLabels();

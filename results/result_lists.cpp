@@ -4,6 +4,7 @@
 #include <QListWidget>
 #include <QSignalBlocker>
 
+#include "entry/check_cubes.h"
 #include "platform/layout.h"
 
 namespace {
@@ -29,6 +30,13 @@ QString SelectedWord(const QListWidget& list) {
 int SelectedIndex(const QListWidget& list) {
     const auto selected = list.selectedItems();
     return selected.isEmpty() ? -1 : list.row(selected.first());
+}
+
+void DescribePlaces(QListWidget& list) {
+    QListWidgetItem& item = *list.selectedItems().first();
+    const QString places = QString::fromStdString(CheckCubes::Places(item.text().toStdString()));
+    const bool bad = list.font().strikeOut();
+    item.setData(Qt::AccessibleDescriptionRole, bad ? "not in dictionary, " + places : places);
 }
 
 // A list selects the neighbour of a selected item before the item is gone.

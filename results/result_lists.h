@@ -17,6 +17,9 @@ int SelectedIndex(const QListWidget& list);
 /// Takes the word at `index` out; where it was selected, none is afterwards.
 void TakeWord(QListWidget& list, int index);
 
+/// Lets a screen reader say where the selected word lies on the board.
+void DescribePlaces(QListWidget& list);
+
 /// The first index of a word, -1 when it is not listed.
 int IndexOf(const QListWidget& list, const QString& word);
 

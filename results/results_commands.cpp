@@ -31,6 +31,10 @@ void AddWhereEntered(QListWidget& userWords, const QTableWidget& entered, const 
     }
 }
 
+void TellCorrection(const QString& word, const char* what) {
+    Platform::Tell(QString("%1 %2. %3").arg(word, what, Common::SummaryText()).toStdString());
+}
+
 }  // namespace
 
 namespace Common {
@@ -59,6 +63,7 @@ void AcceptBadWord() {
     AddWhereEntered(*results.UserWords, *Windows::Shared<Main>().WordList, word);
     AddWord(*results.DictWords, word);
     UpdateResultLabels();
+    TellCorrection(word, "added");
 }
 
 void RejectDictWord() {
@@ -76,6 +81,7 @@ void RejectDictWord() {
     AddWord(*results.BadWords, word);
     TakeWord(*results.DictWords, index);
     UpdateResultLabels();
+    TellCorrection(word, "removed");
 }
 
 void CloseResults() {

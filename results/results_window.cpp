@@ -46,7 +46,9 @@ QListWidget* MakeList(Results* window, const char* name, const char* spokenName,
     SelectByArrowKeys(list);
     const auto showPath = [list] {
         const QString word = SelectedWord(*list);
-        if (!word.isEmpty()) Common::ShowResultPath(word);
+        if (word.isEmpty()) return;
+        Common::ShowResultPath(word);
+        DescribePlaces(*list);
     };
     QObject::connect(list, &QListWidget::itemSelectionChanged, window, showPath);
     QObject::connect(list, &QListWidget::itemClicked, window, showPath);

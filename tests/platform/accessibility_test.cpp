@@ -95,7 +95,7 @@ TEST_F(Accessibility, LabelsListsAndOptionsAreReadAsTheyStand) {
     EXPECT_EQ(name(control("TimeCombo")), "Game Time");
     EXPECT_EQ(name(control("SoundsOption")), "Play Sounds");
     press("Dictionary");
-    EXPECT_EQ(description("StartingLetters"), "Starting letters");
+    EXPECT_EQ(description("StartingLetters"), "BO. Starting letters");
     EXPECT_EQ(rows("DictionaryEditor/WordList"), Words{"bone"});
 }
 

@@ -40,6 +40,7 @@ void GameFixture::resetProcess() {
 
 void GameFixture::useTestDesktop() {
     Platform::WarningSound = [this] { ++warnings_; };
+    Platform::Tell = [this](const std::string& text) { told_.push_back(text); };
     Platform::SteadySeconds = [this] { return seconds_; };
     Platform::ProgramFolder = [this] { return folder_ / "program"; };
     Platform::RandomNumber = [this] {

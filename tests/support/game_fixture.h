@@ -35,12 +35,13 @@ class GameFixture : public testing::Test {
     /// The next shake gives this board. Others are random, from a fixed seed.
     void shakeNext(const std::string& board);
 
-    TempFolder folder_;        ///< home, and below it the program folder
-    std::deque<float> draws_;  ///< the next numbers of the random source
-    std::mt19937 randomness_;  ///< the numbers after those
-    int drawn_ = 0;            ///< numbers taken
-    int warnings_ = 0;         ///< warning sounds asked for
-    double seconds_ = 1000;    ///< the steady clock
+    TempFolder folder_;              ///< home, and below it the program folder
+    std::deque<float> draws_;        ///< the next numbers of the random source
+    std::mt19937 randomness_;        ///< the numbers after those
+    int drawn_ = 0;                  ///< numbers taken
+    int warnings_ = 0;               ///< warning sounds asked for
+    std::vector<std::string> told_;  ///< what a screen reader would say
+    double seconds_ = 1000;          ///< the steady clock
 };
 
 /// Lets the program run in a folder: its home and everything the desktop keeps there.
