@@ -8,6 +8,7 @@ import tempfile
 import time
 
 import pyatspi
+from gi.repository import GLib
 
 WORD_LISTS = [f"/usr/share/dict/scowl/{spelling}-words.{size}"
               for spelling in ("english", "american", "british")
@@ -36,6 +37,29 @@ def everything_in(node):
     for child in node:
         if child:
             yield from everything_in(child)
+
+
+class News:
+    """What the programs have had said by a screen reader."""
+
+    def __init__(self):
+        self.said = []
+        pyatspi.Registry.registerEventListener(
+            self.note, "object:state-changed:showing", "object:announcement")
+
+    def note(self, event):
+        try:
+            if event.type.startswith("object:announcement"):
+                self.said.append(event.any_data)
+            elif event.source.getRole() == pyatspi.ROLE_NOTIFICATION:
+                self.said.append(event.source.name)
+        except GLib.GError:  # a program that has gone meanwhile
+            pass
+
+    def has(self, text):
+        while GLib.MainContext.default().iteration(False):
+            pass
+        return text in self.said
 
 
 def type_text(text):

@@ -7,7 +7,7 @@ from pathlib import Path
 
 sys.path.insert(0, str(Path(__file__).resolve().parents[2] / "packaging"))
 
-from desktop_player import (Program, listed_words, press, traced_words, type_text, wait_for,
+from desktop_player import (News, Program, listed_words, press, traced_words, type_text, wait_for,
                             xdotool)
 
 
@@ -30,11 +30,14 @@ def enter(program, word):
 
 
 def play_and_correct(executable):
+    news = News()
     program = Program(executable)
     xdotool("search", "--onlyvisible", "--class", "^quorle$")  # what the desktop file names
     known, unknown = choose_words(program)
     enter(program, known)
     enter(program, unknown)
+    for said in ("right. 1 word entered", "not in dictionary. 2 words entered"):
+        wait_for(f"'{said}' told to a screen reader", lambda said=said: news.has(said))
     program.press("Quorle", "End game")
     results = "Gorvat Results"
     assert program.words(results, "Your words") == [known]
