@@ -39,7 +39,12 @@ extern "C" {
 QUORLE_ENGINE_API int32_t cReadBinaryDictionary(const char* path);
 
 /* Saves every word and the maximum word size. 0 when that failed; `path` then
- * holds its old content (or the new, where only the folder's sync failed). */
+ * holds its old content (or the new, where only the folder's sync failed).
+ * The form of the file is version 1 of FILE_FORMAT.md; only that is read.
+ *
+ * A file that cReadBinaryDictionary could not read is not lost when it is
+ * replaced: before, it gets a second name, PATH.damaged, or PATH.damaged.2 and
+ * so on, never that of an earlier one, and at no moment neither name stands. */
 QUORLE_ENGINE_API int32_t cWriteBinaryDictionary(const char* path);
 
 /* `*found` becomes 1 when `word` is held, else 0; `*other` becomes 1 when some
@@ -125,7 +130,8 @@ QUORLE_ENGINE_API int32_t cMaxWordSize(void);
 QUORLE_ENGINE_API int32_t cSetMinWordSize(int32_t size);
 QUORLE_ENGINE_API int32_t cSetMaxWordSize(int32_t size);
 
-/* Removes every word longer than the maximum word size. Always 1. */
+/* Removes every word longer than the maximum word size. 0 when memory runs
+ * out; all words then stay. */
 QUORLE_ENGINE_API int32_t cReduceWordSize(void);
 
 /* ---- Settings ------------------------------------------------------------ */

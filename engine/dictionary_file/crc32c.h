@@ -1,0 +1,15 @@
+#pragma once
+// The checksum of dictionary files: CRC-32C (Castagnoli), as in RFC 3720.
+#include <cstddef>
+#include <cstdint>
+#include <span>
+
+namespace Quorle {
+
+/// Continues `crc` (0 at the start) over more bytes.
+std::uint32_t Crc32c(std::uint32_t crc, std::span<const std::byte> bytes);
+
+/// The same without the processor's own instruction.
+std::uint32_t Crc32cByTable(std::uint32_t crc, std::span<const std::byte> bytes);
+
+}  // namespace Quorle

@@ -1,0 +1,90 @@
+#include "graph/edge_store.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <new>
+
+namespace Quorle {
+
+namespace {
+
+constexpr std::size_t MostEdges = 0x7fffffffU;
+
+}  // namespace
+
+std::uint32_t CountWords(const Edge* edges, const Edge& edge) {
+    std::uint32_t count = 0;
+    // A node's words are those up to its last letter, and what goes on from there.
+    for (const Edge* at = &edge; at->next() != 0;) {
+        at = edges + at->first + at->count() - 1;
+        count += at->before;
+    }
+    return count;
+}
+
+EdgeStore::EdgeStore() {
+    reserve(1);
+    edges_[append(1)] = {};
+}
+
+EdgeStore::~EdgeStore() {
+    std::free(edges_);
+}
+
+void EdgeStore::reserve(std::size_t count) {
+    const std::size_t needed = size_ + count;
+    if (needed <= capacity_) return;
+    if (needed > MostEdges) throw std::bad_alloc();
+    // Small steps: memory, not time, is what an edit should spare, and the C library moves large
+    // arrays by their pages.
+    const std::size_t capacity = std::max(needed, capacity_ + capacity_ / 16);
+    void* grown = std::realloc(static_cast<void*>(edges_), capacity * sizeof(Edge));
+    if (grown == nullptr) throw std::bad_alloc();
+    edges_ = static_cast<Edge*>(grown);
+    capacity_ = capacity;
+}
+
+std::uint32_t EdgeStore::append(std::size_t count) {
+    assert(count <= room());
+    const auto index = static_cast<std::uint32_t>(size_);
+    size_ += count;
+    return index;
+}
+
+void EdgeStore::closeBase(const Edge& root) {
+    edges_[0] = root;
+    baseEnd_ = static_cast<std::uint32_t>(size_);
+    void* shrunk = std::realloc(static_cast<void*>(edges_), size_ * sizeof(Edge));
+    if (shrunk == nullptr) return;
+    edges_ = static_cast<Edge*>(shrunk);
+    capacity_ = size_;
+}
+
+std::uint32_t EdgeStore::allocate(std::uint32_t count) {
+    std::uint32_t first = free_[count];
+    if (first != 0) {
+        free_[count] = references(first);
+    } else {
+        first = append(1 + std::size_t{count}) + 1;
+    }
+    references(first) = 1;
+    return first;
+}
+
+void EdgeStore::free(std::uint32_t first, std::uint32_t count) {
+    references(first) = free_[count];
+    free_[count] = first;
+}
+
+void EdgeStore::hold(const Edge& edge) {
+    if (isEdited(edge.first)) ++references(edge.first);
+}
+
+void EdgeStore::release(const Edge& edge) {
+    if (!isEdited(edge.first) || --references(edge.first) > 0) return;
+    const std::uint32_t count = edge.count();
+    for (std::uint32_t i = 0; i < count; ++i) release(edges_[edge.first + i]);
+    free(edge.first, count);
+}
+
+}  // namespace Quorle

@@ -1,0 +1,90 @@
+#pragma once
+// Building the minimal graph of sorted words in one pass.
+#include <array>
+#include <cstdlib>
+#include <memory>
+#include <vector>
+
+#include "graph/packed_word.h"
+#include "graph/word_graph.h"
+
+namespace Quorle {
+
+/// A node in the store: what an edge says of it, and the words that go on from it.
+struct StoredNode {
+    std::uint32_t letters = 0;
+    std::uint32_t first = 0;
+    std::uint32_t words = 0;
+};
+
+/// A node that is still open for more letters.
+struct OpenNode {
+    std::uint32_t letters = 0;
+    std::uint32_t count = 0;
+    std::uint32_t words = 0;
+    std::array<Edge, Letters> edges;
+
+    /// `bit`: of a letter after all that are there.
+    void open(std::uint32_t bit) {
+        assert(letters < bit);
+        letters |= bit;
+        edges[count++] = {0, 0, words};
+    }
+    /// A word ends with the last letter.
+    void endWord() {
+        edges[count - 1].letters |= WordEnds;
+        edges[count - 1].before = ++words;
+    }
+    /// The last letter leads to the node.
+    void lead(const StoredNode& node) {
+        edges[count - 1].letters |= node.letters;
+        edges[count - 1].first = node.first;
+        words += node.words;
+    }
+};
+
+/// Takes words in strictly ascending order, one by one, each in bounded time; so is finishing.
+class GraphBuilder {
+  public:
+    /// Makes room ahead for about so many edges, which saves moving what is built as it grows.
+    explicit GraphBuilder(std::size_t expectedEdges);
+
+    /// `word`: after every word before it. Throws std::bad_alloc; then the builder is of no more
+    /// use.
+    void add(PackedWord word);
+    /// The graph of all words added. The builder is of no more use.
+    WordGraph finish();
+
+    /// Instead of words, nodes can be stored one by one, children first.
+    StoredNode store(const OpenNode& open);
+    /// The graph of a node stored, or of none.
+    WordGraph finish(const StoredNode& root);
+
+  private:
+    // Where stored nodes are found by their edges: a hash table with open addressing.
+    struct Slot {
+        std::uint32_t first;  // 0: free
+        std::uint32_t letters;
+    };
+    struct Free {
+        void operator()(Slot* slots) const { std::free(slots); }
+    };
+    struct Table {
+        explicit Table(std::size_t slots);
+        Slot& find(const OpenNode& open, std::uint64_t hash, const Edge* edges) const;
+        std::unique_ptr<Slot[], Free> slots;
+        std::size_t last;
+        std::size_t room;
+    };
+
+    void closeNodes(std::size_t depth);
+
+    std::shared_ptr<EdgeStore> edges_;
+    std::array<OpenNode, LongestWord + 1> path_;
+    PackedWord last_ = 0;
+    std::size_t depth_ = 0;  // letters of the last word
+    // When a table is full a larger one is begun, and both are looked at: moving one takes long.
+    std::vector<Table> tables_;
+};
+
+}  // namespace Quorle

@@ -1,0 +1,133 @@
+#include "graph/graph_edit.h"
+
+#include <algorithm>
+
+#include "graph/bit_count.h"
+
+// An edit walks the base graph beside the current one. A node that has become like the base node
+// of the same letters is given up for that one, so edits that take each other back leave nothing
+// behind, and what an edited graph needs is what it differs by.
+
+namespace Quorle {
+
+namespace {
+
+constexpr Edge Nowhere;
+
+/// An edge of the edited word's path, and the base edge of the same letters.
+struct Step {
+    Edge* edge;
+    const Edge* base;
+};
+
+class Edit {
+  public:
+    explicit Edit(EdgeStore& store) : store_(store), edges_(store.edges()) {}
+
+    void toggle(Edge& root, std::string_view word);
+
+  private:
+    void own(Edge& to, std::uint32_t bit);
+    void leaveOut(Edge& from, std::uint32_t bit);
+    bool joinBase(Edge& edge, const Edge& base);
+
+    EdgeStore& store_;
+    Edge* const edges_;
+};
+
+// Down the path nodes are copied, and the words behind it counted anew, by one more or less; up
+// again the edges are left out that lead nowhere, and nodes that the base has as well.
+void Edit::toggle(Edge& root, std::string_view word) {
+    std::array<Step, LongestWord + 1> path;
+    Step* step = path.data();
+    *step = {&root, edges_};
+    const std::uint32_t isHeld = [&] {
+        const Edge* at = &root;
+        for (const char letter : word) {
+            const std::uint32_t bit = LetterBit(letter);
+            if ((at->letters & bit) == 0) return 0U;
+            at = edges_ + at->at(bit);
+        }
+        return at->letters >> 31;
+    }();
+    const std::uint32_t change = isHeld != 0 ? ~0U : 1;
+    for (const char letter : word) {
+        const std::uint32_t bit = LetterBit(letter);
+        own(*step->edge, bit);
+        Edge* const edge = edges_ + step->edge->at(bit);
+        Edge* const end = edges_ + step->edge->first + step->edge->count();
+        for (Edge* later = edge + 1; later < end; ++later) later->before += change;
+        const Edge& base = *step->base;
+        *++step = {edge, (base.letters & bit) != 0 ? edges_ + base.at(bit) : &Nowhere};
+    }
+    step->edge->letters ^= WordEnds;
+    step->edge->before += change;
+    for (bool goOn = true; goOn && step != path.data();) {
+        const Edge* const edge = step->edge;
+        --step;
+        goOn = edge->letters == 0;
+        if (goOn)
+            leaveOut(*step->edge, LetterBit(word[static_cast<std::size_t>(step - path.data())]));
+        if (joinBase(*step->edge, *step->base)) goOn = true;
+    }
+}
+
+// Leads the edge to a node that nothing else leads to, with an edge for the letter.
+void Edit::own(Edge& to, std::uint32_t bit) {
+    const bool hasEdge = (to.letters & bit) != 0;
+    const bool isEdited = store_.isEdited(to.first);
+    const bool isShared = !isEdited || store_.references(to.first) > 1;
+    if (hasEdge && !isShared) return;
+    const std::uint32_t count = to.count();
+    const std::uint32_t place = to.at(bit) - to.first;
+    const Edge* const from = edges_ + to.first;
+    const std::uint32_t first = store_.allocate(hasEdge ? count : count + 1);
+    Edge* copy = std::copy_n(from, place, edges_ + first);
+    if (!hasEdge) {
+        const std::uint32_t before = place == count
+                                         ? CountWords(edges_, to)
+                                         : from[place].before - (from[place].isWord() ? 1 : 0);
+        *copy++ = {0, 0, before};
+    }
+    std::copy_n(from + place, count - place, copy);
+    if (isEdited && isShared) {
+        std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
+        store_.release(to);
+    } else if (isEdited) {
+        store_.free(to.first, count);
+    }
+    to.first = first;
+    to.letters |= bit;
+}
+
+// Takes the letter's edge, which leads nowhere, out of the owned node.
+void Edit::leaveOut(Edge& from, std::uint32_t bit) {
+    const std::uint32_t count = from.count();
+    const std::uint32_t place = from.at(bit) - from.first;
+    const std::uint32_t old = from.first;
+    from.letters ^= bit;
+    from.first = count == 1 ? 0 : store_.allocate(count - 1);
+    if (count > 1) {
+        Edge* const to = std::copy_n(edges_ + old, place, edges_ + from.first);
+        std::copy_n(edges_ + old + place + 1, count - place - 1, to);
+    }
+    store_.free(old, count);
+}
+
+bool Edit::joinBase(Edge& edge, const Edge& base) {
+    if (edge.next() != base.next()) return false;
+    const std::uint32_t count = edge.count();
+    const Edge* const own = edges_ + edge.first;
+    if (!std::equal(own, own + count, edges_ + base.first)) return false;
+    if (count > 0) store_.free(edge.first, count);
+    edge.first = base.first;
+    return true;
+}
+
+}  // namespace
+
+void ToggleWord(EdgeStore& store, Edge& root, std::string_view word) {
+    CountingBits([&] { Edit(store).toggle(root, word); });
+}
+
+}  // namespace Quorle

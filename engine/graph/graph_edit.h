@@ -1,0 +1,17 @@
+#pragma once
+// Adding a word to a graph and removing one, copying only the nodes on its path.
+#include <string_view>
+
+#include "graph/edge_store.h"
+#include "graph/packed_word.h"
+
+namespace Quorle {
+
+/// The most edges that one edit appends: each node on the path, with one edge more.
+inline constexpr std::size_t MostEditedEdges = LongestWord * (2 + std::size_t{Letters});
+
+/// Adds the word to what `root` leads to, or removes it when it is held; every other snapshot
+/// stays whole. The store has room for MostEditedEdges.
+void ToggleWord(EdgeStore& store, Edge& root, std::string_view word);
+
+}  // namespace Quorle

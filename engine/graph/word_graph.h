@@ -1,0 +1,52 @@
+#pragma once
+// A set of words as a word graph: words that begin alike share edges, and so do words that end
+// alike. A WordGraph is a snapshot: copying it is cheap, and an edit changes this copy alone.
+// Words are 1 to 16 letters "a" to "z"; whoever calls has checked that.
+#include <memory>
+#include <string_view>
+
+#include "graph/edge_store.h"
+
+namespace Quorle {
+
+class WordGraph {
+  public:
+    WordGraph() = default;
+    /// The base of a finished store.
+    explicit WordGraph(std::shared_ptr<EdgeStore> store);
+    WordGraph(const WordGraph& other);
+    WordGraph(WordGraph&& other) noexcept;
+    WordGraph& operator=(WordGraph other) noexcept;
+    ~WordGraph();
+
+    /// The number of words.
+    std::uint32_t size() const { return size_; }
+    /// Where these letters lead: an edge that counts the words before those that go on from it.
+    /// Without letters and no word when no word begins so.
+    Edge find(std::string_view letters) const;
+
+    /// Adds a word; false when it is held already. Throws std::bad_alloc and changes nothing.
+    bool add(std::string_view word);
+    /// Removes a word; false when it is not held. Throws std::bad_alloc and changes nothing.
+    bool remove(std::string_view word);
+
+    /// Whether no smaller graph spells the same words: true until an edit.
+    bool isMinimal() const { return !store_ || root_ == store_->edges()[0]; }
+    /// Whether both are the same snapshot, with no edit between them.
+    bool operator==(const WordGraph& other) const = default;
+
+    /// For those who walk the edges themselves. Valid until the next edit.
+    const Edge* edges() const { return store_ ? store_->edges() : &root_; }
+    const Edge& root() const { return root_; }
+    /// Above the index of every edge.
+    std::size_t edgesEnd() const { return store_ ? store_->size() : 1; }
+
+  private:
+    bool edit(std::string_view word, bool held);
+
+    std::shared_ptr<EdgeStore> store_;
+    Edge root_;
+    std::uint32_t size_ = 0;
+};
+
+}  // namespace Quorle

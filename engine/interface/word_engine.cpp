@@ -1,0 +1,263 @@
+#include "quorle/word_engine.h"
+
+#include <algorithm>
+#include <filesystem>
+
+#include "dictionary_file/dictionary_file.h"
+#include "files/read_file.h"
+#include "files/replace_file.h"
+#include "graph/graph_copy.h"
+#include "interface/engine_state.h"
+#include "settings/settings_file.h"
+#include "word_file/export.h"
+
+// The flat interface: checks what callers pass, and lets no exception out.
+
+using namespace Quorle;
+
+namespace {
+
+EngineState State;
+
+/// Runs `work`; `nothing` when memory runs out.
+template <class Result, class Work>
+Result Guarded(Result nothing, const Work& work) {
+    try {
+        return work();
+    } catch (...) {
+        return nothing;
+    }
+}
+
+bool IsLetters(std::string_view text) {
+    return std::all_of(text.begin(), text.end(), [](char c) { return c >= 'a' && c <= 'z'; });
+}
+
+/// At most 17 characters, so that a text without end is not read.
+std::string_view Beginning(const char* text) {
+    std::size_t size = 0;
+    while (size <= LongestWord && text[size] != 0) ++size;
+    return {text, size};
+}
+
+bool IsWordSize(std::int32_t size) {
+    return size >= 2 && size <= std::int32_t{LongestWord};
+}
+
+bool IsWord(std::string_view text) {
+    return IsWordSize(static_cast<std::int32_t>(text.size())) && IsLetters(text);
+}
+
+bool IsPrefix(std::int32_t first, std::int32_t second) {
+    return first >= 0 && first < Letters && second >= 0 && second < Letters;
+}
+
+std::string PathWithoutLinks(const char* path) {
+    std::error_code error;
+    return std::filesystem::canonical(path, error).string();
+}
+
+bool LoadDictionary(const char* path) {
+    std::vector<std::byte> bytes;
+    DictionaryContent content;
+    const std::string place = PathWithoutLinks(path);
+    if (!ReadRegularFile(path, bytes) || !DecodeDictionary(bytes, content)) {
+        if (!place.empty()) State.unreadable.insert(place);
+        return false;
+    }
+    State.unreadable.erase(place);
+    State.dictionary.replace(std::move(content.words));
+    State.dictionary.limits.longest = content.maxWordSize;
+    return true;
+}
+
+/// A dictionary that could not be read is not lost when it is replaced.
+bool Save(const char* path, std::span<const std::byte> content) {
+    const std::string place = PathWithoutLinks(path);
+    const bool stays = State.unreadable.contains(place);
+    if (!ReplaceFile(path, content, stays ? Old::Stays : Old::Goes)) return false;
+    State.unreadable.erase(place);
+    return true;
+}
+
+Matching BestMatching() {
+    return CanMatch(Matching::Avx2) ? Matching::Avx2 : Matching::Plain;
+}
+
+/// Finds the words on a board that is 16 letters.
+void SearchBoard(std::string_view letters) {
+    LastSearch& found = State.found;
+    std::copy(letters.begin(), letters.end(), found.board.begin());
+    found.speller.reset();
+    // Out of memory, a search is left in its midst, and must not be used again.
+    auto search =
+        found.search ? std::move(found.search) : std::make_unique<BoardSearch>(BestMatching());
+    search->search(State.dictionary.words(), found.board, State.dictionary.limits, found.words);
+    found.search = std::move(search);
+}
+
+}  // namespace
+
+int32_t cReadBinaryDictionary(const char* path) {
+    return Guarded(0, [&] { return path != nullptr && LoadDictionary(path) ? 1 : 0; });
+}
+
+int32_t cWriteBinaryDictionary(const char* path) {
+    return Guarded(0, [&] {
+        if (path == nullptr) return 0;
+        const Dictionary& dictionary = State.dictionary;
+        return Save(path, EncodeDictionary({dictionary.words(), dictionary.limits.longest})) ? 1
+                                                                                             : 0;
+    });
+}
+
+int32_t cDictionaryCheck(char* word, int32_t* found, int32_t* other) {
+    if (found == nullptr || other == nullptr) return 0;
+    *found = *other = 0;
+    if (word == nullptr || word[0] == 0) return 0;
+    const std::uint32_t letters = State.dictionary.lookUp(word);
+    *other = letters != 0 ? 1 : 0;
+    *found = (letters & WordEnds) != 0 ? 1 : 0;
+    return *found;
+}
+
+int32_t cDictionaryAdd(const char* word) {
+    return Guarded(0, [&] {
+        if (word == nullptr) return 0;
+        const std::string_view letters = Beginning(word);
+        const auto longest = static_cast<std::size_t>(State.dictionary.limits.longest);
+        if (!IsWord(letters) || letters.size() > longest) return 0;
+        State.dictionary.add(letters);
+        return 1;
+    });
+}
+
+int32_t cDictionaryRemove(const char* word) {
+    return Guarded(0, [&] {
+        if (word == nullptr || !IsWord(Beginning(word))) return 0;
+        return State.dictionary.remove(Beginning(word)) ? 1 : 0;
+    });
+}
+
+int32_t cDictionaryClear(void) {
+    State.dictionary.replace({});
+    return 1;
+}
+
+int32_t cNumberOfWords(void) {
+    return static_cast<int32_t>(State.dictionary.words().size());
+}
+
+int32_t cDictIndex(int32_t first, int32_t second) {
+    if (!IsPrefix(first, second)) return -1;
+    const char prefix[] = {static_cast<char>('a' + first), static_cast<char>('a' + second)};
+    const Edge place = State.dictionary.words().find({prefix, 2});
+    if (place.letters == 0) return -1;
+    return static_cast<int32_t>(place.before) - (place.isWord() ? 1 : 0);
+}
+
+int32_t cStartDecodingWords(int32_t first, int32_t second) {
+    if (!IsPrefix(first, second)) return 0;
+    const char prefix[] = {static_cast<char>('a' + first), static_cast<char>('a' + second)};
+    State.listing = WordCursor(State.dictionary.words(), {prefix, 2});
+    return 1;
+}
+
+int16_t cDecodeNextWord(char* buffer) {
+    PackedWord word = 0;
+    if (buffer == nullptr || !State.listing.next(word)) return 0;
+    const std::size_t length = LengthOf(word);
+    WriteLetters(word, length, buffer);
+    return static_cast<int16_t>(length);
+}
+
+int32_t cReadTextFile(const char* path) {
+    return Guarded(100, [&] { return State.merges.step(path); });
+}
+
+int32_t cWriteTextFile(const char* path) {
+    return Guarded(0, [&] {
+        if (path == nullptr) return 0;
+        const std::string text = WordsAsText(State.dictionary.words());
+        return Save(path, std::as_bytes(std::span(text))) ? 1 : 0;
+    });
+}
+
+int32_t cCheckForAllDefinedWords(const char* board) {
+    std::vector<FoundWord>& words = State.found.words;
+    words.clear();
+    const bool done = Guarded(false, [&] {
+        if (board == nullptr || Beginning(board).size() != Cubes) return false;
+        if (IsLetters(Beginning(board))) SearchBoard(Beginning(board));
+        return true;
+    });
+    if (!done) words.clear();
+    return static_cast<int32_t>(words.size());
+}
+
+int32_t cGetDefinedWord(int32_t i, char* buffer, int32_t* n) {
+    if (n == nullptr) return 0;
+    *n = 0;
+    LastSearch& found = State.found;
+    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= found.words.size()) return 0;
+    return Guarded(0, [&] {
+        if (!found.speller) {
+            SortFound(found.words, found.room);
+            found.speller.emplace(found.board);
+        }
+        const FoundWord& word = found.words[static_cast<std::size_t>(i)];
+        WriteLetters((*found.speller)(word), word.letters, buffer);
+        *n = static_cast<int32_t>(word.letters);
+        return 1;
+    });
+}
+
+int32_t cMinWordSize(void) {
+    return State.dictionary.limits.shortest;
+}
+int32_t cMaxWordSize(void) {
+    return State.dictionary.limits.longest;
+}
+
+int32_t cSetMinWordSize(int32_t size) {
+    if (!IsWordSize(size)) return 0;
+    State.dictionary.limits.shortest = size;
+    return 1;
+}
+
+int32_t cSetMaxWordSize(int32_t size) {
+    if (!IsWordSize(size)) return 0;
+    State.dictionary.limits.longest = size;
+    return 1;
+}
+
+int32_t cReduceWordSize(void) {
+    return Guarded(0, [] {
+        const auto longest = static_cast<std::size_t>(State.dictionary.limits.longest);
+        State.dictionary.replace(CopyGraph(State.dictionary.words(), longest));
+        return 1;
+    });
+}
+
+int32_t cGetRegValue(const char* key, const char* name, char* buffer, int32_t* n) {
+    if (n == nullptr) return 0;
+    const std::int32_t room = *n;
+    *n = 0;
+    return Guarded(0, [&] {
+        std::string value;
+        if (key == nullptr || name == nullptr || buffer == nullptr || room < 0 ||
+            !GetSetting(key, name, value) || value.size() > static_cast<std::size_t>(room)) {
+            return 0;
+        }
+        std::copy(value.begin(), value.end(), buffer);
+        *n = static_cast<int32_t>(value.size());
+        return 1;
+    });
+}
+
+int32_t cSetRegValue(const char* key, const char* name, const char* text, int32_t length) {
+    return Guarded(0, [&] {
+        if (key == nullptr || name == nullptr || text == nullptr || length < 0) return 0;
+        return SetSetting(key, name, {text, static_cast<std::size_t>(length)}) ? 1 : 0;
+    });
+}
