@@ -1,5 +1,5 @@
 #pragma once
-// Reading a file whole.
+// Reading files: regular ones alone, so that no pipe and no device is waited for.
 #include <cstddef>
 #include <vector>
 
@@ -7,18 +7,17 @@
 
 namespace Quorle {
 
-enum class ReadResult { Done, Missing, Failed };
+/// Opens a regular file and tells its size; with errno when empty. `path` is relative to the open
+/// folder `folder`, which may be AT_FDCWD.
+FileDescriptor OpenRegularFile(int folder, const char* path, std::size_t& size);
 
-/// Opens a regular file for reading; never waits (a pipe, a device, a folder are refused).
-/// `path` is relative to the open folder `folder`, which may be AT_FDCWD. With errno when empty.
-FileDescriptor OpenRegularFile(int folder, const char* path);
+/// Reads at most `size` bytes, fewer only at the file's end, and tells how many; false when it
+/// cannot be read.
+bool ReadOn(int file, std::byte* to, std::size_t size, std::size_t& got);
 
 /// Reads the whole file, 1 GiB at most, into `out`. `Missing` only when there is no such file;
 /// unless `Done`, `out` is empty.
+enum class ReadResult { Done, Missing, Failed };
 ReadResult ReadFileAt(int folder, const char* path, std::vector<std::byte>& out);
-
-/// Reads the whole regular file at `path` into `out`; false, and `out` empty, when any of it
-/// cannot be read.
-bool ReadRegularFile(const char* path, std::vector<std::byte>& out);
 
 }  // namespace Quorle

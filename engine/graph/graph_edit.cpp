@@ -24,7 +24,7 @@ class Edit {
   public:
     explicit Edit(EdgeStore& store) : store_(store), edges_(store.edges()) {}
 
-    void toggle(Edge& root, std::string_view word);
+    void toggle(Edge& root, std::string_view word, std::uint32_t change);
 
   private:
     void own(Edge& to, std::uint32_t bit);
@@ -37,20 +37,10 @@ class Edit {
 
 // Down the path nodes are copied, and the words behind it counted anew, by one more or less; up
 // again the edges are left out that lead nowhere, and nodes that the base has as well.
-void Edit::toggle(Edge& root, std::string_view word) {
+void Edit::toggle(Edge& root, std::string_view word, std::uint32_t change) {
     std::array<Step, LongestWord + 1> path;
     Step* step = path.data();
     *step = {&root, edges_};
-    const std::uint32_t isHeld = [&] {
-        const Edge* at = &root;
-        for (const char letter : word) {
-            const std::uint32_t bit = LetterBit(letter);
-            if ((at->letters & bit) == 0) return 0U;
-            at = edges_ + at->at(bit);
-        }
-        return at->letters >> 31;
-    }();
-    const std::uint32_t change = isHeld != 0 ? ~0U : 1;
     for (const char letter : word) {
         const std::uint32_t bit = LetterBit(letter);
         own(*step->edge, bit);
@@ -126,8 +116,12 @@ bool Edit::joinBase(Edge& edge, const Edge& base) {
 
 }  // namespace
 
-void ToggleWord(EdgeStore& store, Edge& root, std::string_view word) {
-    CountingBits([&] { Edit(store).toggle(root, word); });
+void AddWord(EdgeStore& store, Edge& root, std::string_view word) {
+    CountingBits([&] { Edit(store).toggle(root, word, 1); });
+}
+
+void RemoveWord(EdgeStore& store, Edge& root, std::string_view word) {
+    CountingBits([&] { Edit(store).toggle(root, word, ~0U); });
 }
 
 }  // namespace Quorle

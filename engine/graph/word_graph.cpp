@@ -48,22 +48,26 @@ Edge WordGraph::find(std::string_view letters) const {
 }
 
 bool WordGraph::add(std::string_view word) {
-    return edit(word, false);
+    assert(!word.empty() && word.size() <= LongestWord);
+    if (find(word).isWord()) return false;
+    prepareEdit();
+    AddWord(*store_, root_, word);
+    ++size_;
+    return true;
 }
 
 bool WordGraph::remove(std::string_view word) {
-    return edit(word, true);
+    if (!find(word).isWord()) return false;
+    prepareEdit();
+    RemoveWord(*store_, root_, word);
+    --size_;
+    return true;
 }
 
 // All memory that an edit can need is asked for before it begins, so that it cannot fail halfway.
-bool WordGraph::edit(std::string_view word, bool held) {
-    assert(!word.empty() && word.size() <= LongestWord);
-    if (find(word).isWord() != held) return false;
+void WordGraph::prepareEdit() {
     if (!store_) store_ = std::make_shared<EdgeStore>();
     store_->reserve(MostEditedEdges);
-    ToggleWord(*store_, root_, word);
-    size_ += held ? ~0U : 1;
-    return true;
 }
 
 }  // namespace Quorle

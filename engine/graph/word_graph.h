@@ -42,7 +42,7 @@ class WordGraph {
     std::size_t edgesEnd() const { return store_ ? store_->size() : 1; }
 
   private:
-    bool edit(std::string_view word, bool held);
+    void prepareEdit();
 
     std::shared_ptr<EdgeStore> store_;
     Edge root_;

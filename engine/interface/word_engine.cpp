@@ -1,5 +1,7 @@
 #include "quorle/word_engine.h"
 
+#include <fcntl.h>
+
 #include <algorithm>
 #include <filesystem>
 
@@ -9,7 +11,6 @@
 #include "graph/graph_copy.h"
 #include "interface/engine_state.h"
 #include "settings/settings_file.h"
-#include "word_file/export.h"
 
 // The flat interface: checks what callers pass, and lets no exception out.
 
@@ -61,7 +62,8 @@ bool LoadDictionary(const char* path) {
     std::vector<std::byte> bytes;
     DictionaryContent content;
     const std::string place = PathWithoutLinks(path);
-    if (!ReadRegularFile(path, bytes) || !DecodeDictionary(bytes, content)) {
+    const bool isRead = ReadFileAt(AT_FDCWD, path, bytes) == ReadResult::Done;
+    if (!isRead || !DecodeDictionary(bytes, content)) {
         if (!place.empty()) State.unreadable.insert(place);
         return false;
     }
@@ -78,6 +80,18 @@ bool Save(const char* path, std::span<const std::byte> content) {
     if (!ReplaceFile(path, content, stays ? Old::Stays : Old::Goes)) return false;
     State.unreadable.erase(place);
     return true;
+}
+
+/// Every word, in alphabetical order, one a line.
+std::string WordsAsText(const WordGraph& words) {
+    std::string text;
+    WordCursor cursor(words);
+    for (PackedWord word = 0; cursor.next(word);) {
+        char letters[LongestWord];
+        WriteLetters(word, LengthOf(word), letters);
+        text.append(letters, LengthOf(word)).push_back('\n');
+    }
+    return text;
 }
 
 Matching BestMatching() {

@@ -1,5 +1,6 @@
 #include "settings/settings_file.h"
 
+#include <fcntl.h>
 #include <sys/stat.h>
 
 #include <algorithm>
@@ -93,7 +94,8 @@ bool GetSetting(std::string_view key, std::string_view name, std::string& value)
     const std::string folder = SettingsFolder();
     std::vector<std::byte> content;
     if (folder.empty() || !IsName(key) || !IsName(name)) return false;
-    if (!ReadRegularFile((folder + "/settings").c_str(), content)) return false;
+    const std::string path = folder + "/settings";
+    if (ReadFileAt(AT_FDCWD, path.c_str(), content) != ReadResult::Done) return false;
     const std::string start = LineStart(key, name);
     std::string_view text = AsText(content);
     while (!text.empty()) {

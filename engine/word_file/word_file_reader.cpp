@@ -1,7 +1,6 @@
 #include "word_file/word_file_reader.h"
 
 #include <fcntl.h>
-#include <sys/stat.h>
 
 #include "files/read_file.h"
 #include "word_file/word_text.h"
@@ -14,17 +13,6 @@ constexpr std::size_t BlockSize = std::size_t{16} << 10;
 // Of a token that lies across blocks no more is kept: it is no word, however it goes on.
 constexpr std::size_t MostKept = LongestWord + 1;
 
-/// Reads `size` bytes, or as many as the file has; false when it cannot be read.
-bool ReadBlock(int file, std::byte* to, std::size_t size, std::size_t& used) {
-    for (used = 0; used < size;) {
-        const ssize_t got = RepeatInterrupted([&] { return read(file, to + used, size - used); });
-        if (got < 0) return false;
-        if (got == 0) return true;
-        used += static_cast<std::size_t>(got);
-    }
-    return true;
-}
-
 bool HasByteOrderMark(const std::vector<std::byte>& text) {
     return text[0] == std::byte{0xEF} && text[1] == std::byte{0xBB} && text[2] == std::byte{0xBF};
 }
@@ -32,18 +20,16 @@ bool HasByteOrderMark(const std::vector<std::byte>& text) {
 }  // namespace
 
 bool WordFileReader::open(const char* path) {
-    file_ = OpenRegularFile(AT_FDCWD, path);
-    struct stat status;
-    if (!file_ || fstat(file_.number(), &status) != 0) return false;
-    size_ = left_ = static_cast<std::size_t>(status.st_size);
+    file_ = OpenRegularFile(AT_FDCWD, path, size_);
+    left_ = size_;
     text_.resize(MostKept + BlockSize + LongestWord);
-    return true;
+    return static_cast<bool>(file_);
 }
 
 WordFileReader::Progress WordFileReader::readOn() {
     const std::size_t size = std::min(left_, BlockSize);
     std::size_t got = 0;
-    if (!ReadBlock(file_.number(), text_.data() + used_, size, got)) return Progress::Failed;
+    if (!ReadOn(file_.number(), text_.data() + used_, size, got)) return Progress::Failed;
     if (left_ == size_ && got >= 3 && HasByteOrderMark(text_)) {
         std::fill_n(text_.begin(), 3, std::byte{' '});
     }
@@ -53,7 +39,7 @@ WordFileReader::Progress WordFileReader::readOn() {
     if (left_ > 0 && got == size) return Progress::Reading;
     // A word that was written on beyond the end since the file was opened is taken whole.
     if (used_ > 0) {
-        if (!ReadBlock(file_.number(), text_.data() + used_, MostKept, got)) {
+        if (!ReadOn(file_.number(), text_.data() + used_, MostKept, got)) {
             return Progress::Failed;
         }
         std::byte* const rest = text_.data() + used_;

@@ -1,7 +1,6 @@
-#include "dictionary_file/dictionary_decoder.h"
+#include "dictionary_file/graph_codec.h"
 
 #include <algorithm>
-#include <vector>
 
 #include "dictionary_file/populate.h"
 #include "graph/bit_count.h"

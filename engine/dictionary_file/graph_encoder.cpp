@@ -1,4 +1,4 @@
-#include "dictionary_file/dictionary_encoder.h"
+#include "dictionary_file/graph_codec.h"
 
 #include <algorithm>
 #include <unordered_map>
