@@ -98,16 +98,24 @@ void AddBoardRows(const WordList& words) {
     AddFigure({"one search with cold caches", "a millisecond", "under 1 ms", "under 0.05 ms"},
               Rounded(ColdSearch(boards), " ms"));
     const std::string way = "the usual way";
-    AddSearches({"random board, all words fetched", way, "14 ×", "22 ×"}, boards, dictionary, usual,
+    AddSearches({"random board, all words fetched", way, "18 ×", "24 ×"}, boards, dictionary, usual,
                 true);
     AddSearches({"random board, count only", way, "20 ×", "30 ×"}, boards, dictionary, usual,
                 false);
-    AddSearches({"board of most words (" + mostWords + "), fetched", way, "12 ×", "18 ×"},
+    AddSearches({"board of most words (" + mostWords + "), fetched", way, "12 ×", "20 ×"},
                 {mostWords}, dictionary, usual, true);
-    AddSearches({"board of most chains (" + mostChains + "), fetched", way, "12 ×", "18 ×"},
+    AddSearches({"board of most chains (" + mostChains + "), fetched", way, "12 ×", "20 ×"},
                 {mostChains}, dictionary, usual, true);
-    AddSearches({"boards of one and two letters, fetched", way, "7 ×", "10 ×"}, FewLetterBoards(),
+    AddSearches({"boards of one and two letters, fetched", way, "7 ×", "12 ×"}, FewLetterBoards(),
                 dictionary, usual, true);
+    const std::string plain = ", without AVX2";
+    AddPlainSearch({"random board, fetched" + plain, way, "", ""}, boards, dictionary, usual);
+    AddPlainSearch({"board of most words, fetched" + plain, way, "", ""}, {mostWords}, dictionary,
+                   usual);
+    AddPlainSearch({"board of most chains, fetched" + plain, way, "", ""}, {mostChains}, dictionary,
+                   usual);
+    AddPlainSearch({"boards of one and two letters, fetched" + plain, way, "", ""},
+                   FewLetterBoards(), dictionary, usual);
     AddSearches({"board of one letter, dictionary of its runs, fetched", way, "50 ×", "200 ×"},
                 {std::string(16, 'a')}, DictionaryOf("runs", Runs()),
                 std::make_shared<UsualWay>(Runs()), true, 1);
