@@ -2,7 +2,6 @@
 
 #include <algorithm>
 
-#include "dictionary_file/populate.h"
 #include "graph/bit_count.h"
 #include "graph/packed_word.h"
 
@@ -101,10 +100,8 @@ std::shared_ptr<EdgeStore> Decoder::read() {
     store->reserve(header_.edges);
     store->append(header_.edges);
     edges_ = store->edges();
-    Populate(edges_, store->size() * sizeof *edges_);
     const std::size_t count = MostWaiting + 1 + std::size_t{header_.shared};
     nodes_.reserve(count);
-    Populate(nodes_.data(), count * sizeof nodes_[0]);
     nodes_.resize(count);
     if (!readTables() || !readAllNodes() || !isFinished()) return nullptr;
     store->closeBase({nodes_[0].letters, nodes_[0].first});

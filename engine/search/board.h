@@ -30,27 +30,21 @@ inline constexpr auto Around = [] {
     return around;
 }();
 
-class BoardPlaces {
-  public:
+struct BoardPlaces {
+    std::array<std::uint32_t, Places> shown;       ///< the letter of each place, as a bit
+    std::array<std::uint32_t, Places> touching{};  ///< bit i: place i can follow
+
     explicit BoardPlaces(const Board& board) {
-        letters_.fill(NoLetter);
+        shown.fill(NoLetter);
         for (std::uint32_t cube = 0; cube < Cubes; ++cube) {
-            letters_[cube] = 1U << (board[cube] - 'a');
-            touching_[cube] = Around[cube];
+            shown[cube] = 1U << (board[cube] - 'a');
+            touching[cube] = Around[cube];
             if (board[cube] != 'q') continue;
-            letters_[Cubes + cube] = 1U << ('u' - 'a');
-            touching_[Cubes + cube] = Around[cube];
-            touching_[cube] = 1U << (Cubes + cube);
+            shown[Cubes + cube] = 1U << ('u' - 'a');
+            touching[Cubes + cube] = Around[cube];
+            touching[cube] = 1U << (Cubes + cube);
         }
     }
-    /// The letter that a place shows, as a bit.
-    const std::array<std::uint32_t, Places>& letters() const { return letters_; }
-    /// Bit i: place i can follow.
-    const std::array<std::uint32_t, Places>& touching() const { return touching_; }
-
-  private:
-    std::array<std::uint32_t, Places> letters_{};
-    std::array<std::uint32_t, Places> touching_{};
 };
 
 }  // namespace Quorle

@@ -65,9 +65,8 @@ struct BoardSearch::State {
     // what one block can grow to. One chain more may be written and not counted.
     std::array<Chain, (LongestWord + 1) * Block * MostTouching + 1> chains;
     std::array<Level, LongestWord + 2> levels;
-    std::array<Fields, Places> kept;             // of a chain that goes on to the place
-    std::array<std::uint32_t, Places> shown;     // the letter of each place, as a bit
-    std::array<std::uint32_t, Places> touching;  // bit i: place i can follow
+    const BoardPlaces* places;
+    std::array<Fields, Places> kept;  // of a chain that goes on to the place
     NumberSet known;
     RecentChains recent;  // once a board is hard
     std::vector<FoundWord>* found;
@@ -125,6 +124,8 @@ inline Chain* BoardSearch::State::extend(const Match& match, const Chain* chain,
     const std::uint32_t isLong = letters + 1 >= limits.shortest ? 1 : 0;
     FoundWord* word = words.data();
     const Edge* const all = edges;
+    const std::array<std::uint32_t, Places>& shown = places->shown;
+    const std::array<std::uint32_t, Places>& touching = places->touching;
     for (std::uint32_t next = chain->next; chain != end;) {
         const auto place = static_cast<std::uint32_t>(std::countr_zero(next));
         const std::uint32_t bit = shown[place];
@@ -208,8 +209,7 @@ void BoardSearch::search(const WordGraph& graph, const Board& board, WordLimits 
     if (limits.shortest > limits.longest) return;
     const BoardPlaces places(board);
     State& state = *state_;
-    state.shown = places.letters();
-    state.touching = places.touching();
+    state.places = &places;
     state.known.resize(graph.size());
     state.found = &found;
     state.edges = graph.edges();

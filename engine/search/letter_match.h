@@ -17,7 +17,7 @@ class PlainMatch {
     explicit PlainMatch(const BoardPlaces& places) {
         std::array<std::uint32_t, 32> shown{};
         for (std::uint32_t i = 0; i < Places; ++i) {
-            shown[static_cast<std::uint32_t>(std::countr_zero(places.letters()[i]))] |= 1U << i;
+            shown[static_cast<std::uint32_t>(std::countr_zero(places.shown[i]))] |= 1U << i;
         }
         for (std::uint32_t table = 0; table < 3; ++table) {
             for (std::uint32_t bit = 0; bit < 9; ++bit) {
@@ -47,7 +47,7 @@ class Avx2Match {
         alignas(32) std::array<std::uint8_t, Places> bytes{};
         alignas(32) std::array<std::uint8_t, Places> bits{};
         for (std::uint32_t i = 0; i < Places; ++i) {
-            const auto letter = static_cast<std::uint32_t>(std::countr_zero(places.letters()[i]));
+            const auto letter = static_cast<std::uint32_t>(std::countr_zero(places.shown[i]));
             bytes[i] = static_cast<std::uint8_t>(letter / 8);
             bits[i] = static_cast<std::uint8_t>(1U << letter % 8);
         }

@@ -4,9 +4,6 @@
 #include <chrono>
 #include <new>
 
-#include "word_file/merged_dictionary.h"
-#include "word_file/word_file_reader.h"
-
 namespace Quorle {
 
 namespace {
@@ -19,39 +16,31 @@ constexpr double ReadingShare = 0.4;  // of a file's time; the rest is building
 
 }  // namespace
 
-/// A file on its way into the dictionary.
-struct FileMerge {
-    WordFileReader reader;
-    std::unique_ptr<MergedDictionary> build;  // once all is read
-
-    bool work(Dictionary& dictionary);
-    double fraction() const;
-};
-
-/// Does a piece of the work; true when nothing is left to do.
-bool FileMerge::work(Dictionary& dictionary) {
+/// Does a piece of the current file's work.
+void MergeLine::workOnce() {
     using Progress = WordFileReader::Progress;
-    if (build) return build->work();
-    const Progress progress = reader.readOn();
-    if (progress == Progress::Done) {
-        build = std::make_unique<MergedDictionary>(dictionary, reader.words());
+    if (build_) {
+        if (build_->work()) endCurrent();
+        return;
     }
-    return progress == Progress::Failed;
+    const Progress progress = current_->readOn();
+    if (progress == Progress::Failed) endCurrent();
+    if (progress != Progress::Done) return;
+    build_ = std::make_unique<MergedDictionary>(dictionary_, current_->words());
 }
 
-double FileMerge::fraction() const {
-    return build ? ReadingShare + (1 - ReadingShare) * build->fraction()
-                 : ReadingShare * reader.fraction();
+/// The part of the current file that is done, 0..1.
+double MergeLine::fraction() const {
+    if (!current_) return 0;
+    return build_ ? ReadingShare + (1 - ReadingShare) * build_->fraction()
+                  : ReadingShare * current_->fraction();
 }
-
-MergeLine::MergeLine(Dictionary& dictionary) : dictionary_(dictionary) {}
-MergeLine::~MergeLine() = default;
 
 /// Begins with the next file that can be read; false when there is none.
 bool MergeLine::beginNext() {
     while (!waiting_.empty()) {
-        auto next = std::make_unique<FileMerge>();
-        const bool readable = next->reader.open(waiting_.front().c_str());
+        auto next = std::make_unique<WordFileReader>();
+        const bool readable = next->open(waiting_.front().c_str());
         waiting_.pop_front();
         if (readable) {
             current_ = std::move(next);
@@ -63,6 +52,7 @@ bool MergeLine::beginNext() {
 }
 
 void MergeLine::endCurrent() {
+    build_.reset();
     current_.reset();
     ++done_;
 }
@@ -73,7 +63,7 @@ bool MergeLine::work() {
     do {
         if (!current_ && !beginNext()) return false;
         try {
-            if (current_->work(dictionary_)) endCurrent();
+            workOnce();
         } catch (const std::bad_alloc&) {
             endCurrent();  // its words do not fit in memory; the dictionary is as it was
         }
@@ -83,7 +73,7 @@ bool MergeLine::work() {
 
 std::int32_t MergeLine::percent() {
     const double files = done_ + 1 + static_cast<double>(waiting_.size());
-    const double done = (done_ + (current_ ? current_->fraction() : 0)) / files;
+    const double done = (done_ + fraction()) / files;
     percent_ = std::clamp(static_cast<std::int32_t>(100 * done), percent_, 99);
     return percent_;
 }

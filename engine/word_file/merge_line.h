@@ -4,17 +4,15 @@
 #include <memory>
 #include <string>
 
-#include "graph/dictionary.h"
+#include "word_file/merged_dictionary.h"
+#include "word_file/word_file_reader.h"
 
 namespace Quorle {
-
-struct FileMerge;
 
 /// The files asked for since nothing was stepping.
 class MergeLine {
   public:
-    explicit MergeLine(Dictionary& dictionary);
-    ~MergeLine();
+    explicit MergeLine(Dictionary& dictionary) : dictionary_(dictionary) {}
 
     /// Does a step of at most about 8 ms and returns the percentage done: 0..99, never falling,
     /// then 100. `path` starts a merge, or joins the line behind the one that steps; "dummy" and
@@ -25,10 +23,13 @@ class MergeLine {
     bool beginNext();
     void endCurrent();
     bool work();
+    void workOnce();
+    double fraction() const;
     std::int32_t percent();
 
     Dictionary& dictionary_;
-    std::unique_ptr<FileMerge> current_;
+    std::unique_ptr<WordFileReader> current_;
+    std::unique_ptr<MergedDictionary> build_;  // once all of the current file is read
     std::deque<std::string> waiting_;
     int done_ = 0;
     std::int32_t percent_ = 0;

@@ -5,7 +5,7 @@
 #include <cstring>
 
 #include "dictionary_file/crc32c.h"
-#include "dictionary_file/dictionary_codes.h"
+#include "dictionary_file/graph_codec.h"
 #include "graph/graph_copy.h"
 #include "random_words.h"
 
