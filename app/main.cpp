@@ -45,9 +45,9 @@ int main(int argc, char** argv) {
     Platform::UseDesktop();
     // Every window made anew has its pictures cached once more; ten times this is Qt's own bound.
     QPixmapCache::setCacheLimit(PictureCache);
-    // Before there is an application: after, another style would have been made already.
-    QApplication::setStyle(new LegibleStyle);
     QApplication application(argc, argv);
+    // Before, there would be no desktop yet whose style could be asked for.
+    QApplication::setStyle(new LegibleStyle(QApplication::style()));
     // The texts are English and have their places; mirrored, "=>" would point back.
     QApplication::setLayoutDirection(Qt::LeftToRight);
     QApplication::setApplicationName("quorle");

@@ -19,6 +19,14 @@ namespace {
 constexpr std::int32_t Complete = 100;
 constexpr const char* NextStep = "dummy";
 
+// Words may come in at any step: each file's at its end, others still in line.
+std::int32_t Read(const char* path) {
+    const std::int32_t before = cNumberOfWords();
+    const std::int32_t percent = cReadTextFile(path);
+    if (cNumberOfWords() != before) State.DictionaryChanged = True;
+    return percent;
+}
+
 void SetBarWidth(QLabel& bar, double twips) {
     bar.resize(Twips(qRound(twips)), bar.height());
 }
@@ -61,7 +69,7 @@ namespace Dictionary {
 void StartMerge() {
     const std::string path = Platform::ChooseFileToOpen(Platform::ProgramFolder());
     if (path.empty()) return;
-    const std::int32_t percent = cReadTextFile(path.c_str());
+    const std::int32_t percent = Read(path.c_str());
     if (percent >= Complete) {
         ListStartingLetters(True);
         ListWords();
@@ -80,7 +88,7 @@ void StartMerge() {
 void MergeStep() {
     Progress& window = Windows::Shared<Progress>();
     window.DictionaryTimer->stop();
-    const std::int32_t percent = cReadTextFile(NextStep);
+    const std::int32_t percent = Read(NextStep);
     if (percent >= Complete) return FinishMerge(window);
     ShowProgress(window, percent);
     window.DictionaryTimer->start();

@@ -1,13 +1,14 @@
 #pragma once
 #include <QProxyStyle>
 
-/// The desktop's style, its palette made legible: every text that is not disabled
-/// has a contrast of at least 4.5 to its background. The focus of
-/// lists and menu bars is seen. Install it for the application.
+/// A style, the desktop's, with its palette made legible: every text that is not
+/// disabled has a contrast of at least 4.5 to its background. The focus of lists
+/// and menu bars is seen. Install it for the application.
 class LegibleStyle : public QProxyStyle {
     Q_OBJECT
 
   public:
+    using QProxyStyle::QProxyStyle;  ///< of the style that it adds to, which it owns from then on
     void polish(QPalette& palette) override;
     using QProxyStyle::polish;
     void drawControl(ControlElement element, const QStyleOption* option, QPainter* painter,

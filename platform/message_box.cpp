@@ -1,19 +1,32 @@
 #include "platform/message_box.h"
 
+#include <QCloseEvent>
+#include <QKeyEvent>
 #include <QMessageBox>
 
 #include "platform/window_front.h"
 
 namespace {
 
+// At a question a stray Escape would be taken for a No, so only its buttons answer.
+class Question : public QMessageBox {
+  public:
+    using QMessageBox::QMessageBox;
+
+  protected:
+    void closeEvent(QCloseEvent* event) override { event->ignore(); }
+    void keyPressEvent(QKeyEvent* event) override {
+        if (!event->matches(QKeySequence::Cancel)) QMessageBox::keyPressEvent(event);
+    }
+};
+
+template <class Box>
 QMessageBox::StandardButton Run(const std::string& text, const std::string& title,
-                                QMessageBox::StandardButtons buttons,
-                                QMessageBox::StandardButton escape) {
-    QMessageBox box(QMessageBox::NoIcon, QString::fromStdString(title),
-                    QString::fromStdString(text), buttons, WindowFront::Latest());
+                                QMessageBox::StandardButtons buttons) {
+    Box box(QMessageBox::NoIcon, QString::fromStdString(title), QString::fromStdString(text),
+            buttons, WindowFront::Latest());
     box.setTextFormat(Qt::PlainText);
     box.setWindowModality(Qt::ApplicationModal);
-    box.setEscapeButton(escape);
     box.exec();
     const auto pressed = box.standardButton(box.clickedButton());
     box.hide();
@@ -26,12 +39,11 @@ QMessageBox::StandardButton Run(const std::string& text, const std::string& titl
 namespace MessageBox {
 
 void Show(const std::string& text, const std::string& title) {
-    Run(text, title, QMessageBox::Ok, QMessageBox::Ok);
+    Run<QMessageBox>(text, title, QMessageBox::Ok);
 }
 
 bool Ask(const std::string& text, const std::string& title) {
-    return Run(text, title, QMessageBox::Yes | QMessageBox::No, QMessageBox::No) ==
-           QMessageBox::Yes;
+    return Run<Question>(text, title, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
 
 }  // namespace MessageBox

@@ -7,7 +7,7 @@ namespace MessageBox {
 /// Waits until the player has pressed OK or Escape.
 void Show(const std::string& text, const std::string& title);
 
-/// True for Yes; No and Escape are false.
+/// True for Yes, false for No. Nothing else closes the box.
 bool Ask(const std::string& text, const std::string& title);
 
 }  // namespace MessageBox

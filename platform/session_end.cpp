@@ -20,7 +20,9 @@ void NoteSignal(int signal) {
     [[maybe_unused]] const auto written = write(PipeEnds[1], &number, 1);
 }
 
-void EndBySignal(int signal) {
+// Asked a second time below an open box, the player could answer the two differently.
+void Close(const std::function<void()>& close, int signal) {
+    if (QApplication::activeModalWidget() == nullptr) return close();
     std::signal(signal, SIG_DFL);
     std::raise(signal);
 }
@@ -30,9 +32,7 @@ void FollowSignals(const std::function<void()>& close) {
     auto* notifier = new QSocketNotifier(PipeEnds[0], QSocketNotifier::Read, qApp);
     QObject::connect(notifier, &QSocketNotifier::activated, qApp, [close] {
         char signal = 0;
-        if (read(PipeEnds[0], &signal, 1) != 1) return;
-        if (QApplication::activeModalWidget() != nullptr) EndBySignal(signal);
-        close();
+        if (read(PipeEnds[0], &signal, 1) == 1) Close(close, signal);
     });
     for (const int signal : {SIGTERM, SIGINT, SIGHUP}) std::signal(signal, NoteSignal);
 }
@@ -44,7 +44,7 @@ void FollowSessionEnd(std::function<void()> close) {
     QObject::connect(qApp, &QGuiApplication::commitDataRequest, qApp,
                      [close = std::move(close)](QSessionManager& session) {
                          if (!session.allowsInteraction()) return;
-                         close();
+                         Close(close, SIGTERM);
                          session.release();
                      });
 }

@@ -3,6 +3,6 @@
 #include <functional>
 
 /// Runs `close` when the session ends and the player can be asked, and on SIGTERM,
-/// SIGINT and SIGHUP. A signal while a box is open ends the program at once: what
-/// the box asks about stays as it was.
+/// SIGINT and SIGHUP. While a box is open each of these ends the program at once
+/// instead: what the box asks about stays as it was.
 void FollowSessionEnd(std::function<void()> close);

@@ -39,13 +39,17 @@ void DescribePlaces(QListWidget& list) {
     item.setData(Qt::AccessibleDescriptionRole, bad ? "not in dictionary, " + places : places);
 }
 
-// A list selects the neighbour of a selected item before the item is gone.
+// A list selects the neighbour of its current item, selected or not, before the
+// item is gone.
 void TakeWord(QListWidget& list, int index) {
     const QSignalBlocker quiet(list.selectionModel());
     const QSignalBlocker quietList(list);
-    const bool wasSelected = list.item(index)->isSelected();
-    delete list.takeItem(index);
-    if (wasSelected) list.clearSelection();
+    auto selected = list.selectedItems();
+    QListWidgetItem* taken = list.takeItem(index);
+    selected.removeAll(taken);
+    delete taken;
+    list.clearSelection();
+    for (QListWidgetItem* item : selected) item->setSelected(true);
 }
 
 int IndexOf(const QListWidget& list, const QString& word) {

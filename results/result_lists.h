@@ -14,7 +14,8 @@ void AddWord(QListWidget& list, const QString& word);
 QString SelectedWord(const QListWidget& list);
 int SelectedIndex(const QListWidget& list);
 
-/// Takes the word at `index` out; where it was selected, none is afterwards.
+/// Takes the word at `index` out. The word selected stays so; where it was this one,
+/// none is afterwards.
 void TakeWord(QListWidget& list, int index);
 
 /// Lets a screen reader say where the selected word lies on the board.

@@ -1,3 +1,6 @@
+#include <QAbstractItemView>
+#include <QStringListModel>
+
 #include "dictionary/editor_fixture.h"
 #include "platform/platform.h"
 
@@ -46,6 +49,27 @@ TEST_F(Editor, RemovesTheSelectedWordAndKeepsThePrefixWhileItLasts) {
         press("Remove");
     }
     EXPECT_EQ(shown(), "BO ZO | BO: bone | 2 words");
+}
+
+TEST_F(Editor, ChoosingAPrefixListsItsWordsOnceAlsoTheSameAgain) {
+    int listed = 0;
+    QObject::connect(prefixes().window()->findChild<QStringListModel*>(),
+                     &QAbstractItemModel::modelReset, [&listed] { ++listed; });
+    const auto choose = [this](Qt::Key step) {
+        prefixes().setFocus();
+        key(Qt::Key_Space);
+        QWidget* open = prefixes().view();
+        ASSERT_TRUE(QTest::qWaitFor([open] { return open->isVisible(); }));
+        QTest::keyClick(open, step);
+        QTest::keyClick(open, Qt::Key_Return);
+        QCoreApplication::processEvents();
+    };
+    cDictionaryAdd("bond");
+    choose(Qt::Key_Home);
+    EXPECT_EQ(shown(), "BO CA ZO | BO: bond bone | 5 words");
+    choose(Qt::Key_Down);
+    EXPECT_EQ(shown(), "BO CA ZO | CA: cab cat | 5 words");
+    EXPECT_EQ(listed, 2);
 }
 
 TEST_F(Editor, ClearsAfterAQuestionAndOffersNoSaving) {

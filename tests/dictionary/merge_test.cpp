@@ -97,6 +97,18 @@ TEST_F(Merging, ASecondFileWaitsInLine) {
     EXPECT_FALSE(stepping());
 }
 
+TEST_F(Merging, LeavingOffersTheWordsThatAreInWhileAnotherFileIsInLine) {
+    mergeMany('m');
+    press("Dictionary");
+    mergeMany('a');
+    EXPECT_TRUE(QTest::qWaitFor([] { return cNumberOfWords() > ManyWords; }, 60'000));
+    EXPECT_TRUE(stepping());
+    boxes_.expectQuestion("Dictionary has been updated, do you want to save it?", QMessageBox::Yes,
+                          "Save dictionary?");
+    press("Main/Exit");
+    EXPECT_EQ(wordsOnDisk(), ManyWords + 4);
+}
+
 TEST_F(Merging, LeavingOffersWhatElseChanged) {
     enter({"apt"});
     mergeMany('a');

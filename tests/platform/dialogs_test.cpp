@@ -21,19 +21,24 @@ class Dialogs : public PlayedBoard {
     }
 };
 
-TEST_F(Dialogs, EscapeIsNoAndTheFrontComesBack) {
+TEST_F(Dialogs, OnlyItsButtonsAnswerAQuestionAndTheFrontComesBack) {
+    for (const Qt::Key answer : {Qt::Key_N, Qt::Key_Y}) {
+        boxes_.expectModal([answer](QWidget& box) {
+            EXPECT_EQ(box.parentWidget()->objectName(), "Main");
+            EXPECT_LT((box.frameGeometry().center() - box.parentWidget()->frameGeometry().center())
+                          .manhattanLength(),
+                      40);
+            QTest::keyClick(&box, Qt::Key_Escape);
+            EXPECT_FALSE(box.close());
+            EXPECT_TRUE(box.isVisible());
+            QTest::keyClick(&box, answer, Qt::AltModifier);
+        });
+        EXPECT_EQ(Platform::AskYesNo("Sure?", "Quorle"), answer == Qt::Key_Y);
+        EXPECT_TRUE(comesToFront("Main"));
+        EXPECT_EQ(Platform::WindowInFront(), 1);
+    }
     boxes_.expectModal([](QWidget& box) { QTest::keyClick(&box, Qt::Key_Escape); });
-    EXPECT_FALSE(Platform::AskYesNo("Sure?", "Quorle"));
-    boxes_.expectModal([](QWidget& box) {
-        EXPECT_EQ(box.parentWidget()->objectName(), "Main");
-        EXPECT_LT((box.frameGeometry().center() - box.parentWidget()->frameGeometry().center())
-                      .manhattanLength(),
-                  40);
-        QTest::keyClick(&box, Qt::Key_Return);
-    });
-    EXPECT_TRUE(Platform::AskYesNo("Sure?", "Quorle"));
-    EXPECT_TRUE(comesToFront("Main"));
-    EXPECT_EQ(Platform::WindowInFront(), 1);
+    Platform::ShowMessage("Done.", "Quorle");
 }
 
 TEST_F(Dialogs, ASavedFileGetsASuffixAndIsReplacedOnlyWhenAllowed) {

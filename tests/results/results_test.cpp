@@ -129,6 +129,20 @@ TEST_F(GameResults, WordsGoIntoTheDictionaryAndOutOfIt) {
     EXPECT_EQ(lists(), "boned cat [con] sta | | bone boned cat cats coat con sta ten tone won | ");
 }
 
+TEST_F(GameResults, AWordTakenOutLeavesTheSelectionAsItWas) {
+    play({"cat", "cats", "coat"});
+    select("UserWords", "cat");
+    for (const char* word : {"cat", "cats"}) {  // the second is the current one, unselected
+        select("DictWords", word);
+        press("RemoveFromDict");
+        EXPECT_EQ(lists().find('['), std::string::npos) << lists();
+    }
+    select("UserWords", "coat");
+    select("DictWords", "bone");
+    press("RemoveFromDict");
+    EXPECT_EQ(lists(), "[coat] | bone cat cats | coat ten tone won | ");
+}
+
 TEST_F(GameResults, CloseOnlyAfterTwoSeconds) {
     play({"cat", "sta"});
     key(Qt::Key_Escape);

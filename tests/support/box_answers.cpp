@@ -16,6 +16,11 @@ std::string TextOf(const QWidget& window) {
     return (box == nullptr ? window.objectName() : box->text()).toStdString();
 }
 
+// Also what no key and no title bar closes.
+void Dismiss(QWidget& window) {
+    dynamic_cast<QDialog&>(window).done(QDialog::Rejected);
+}
+
 }  // namespace
 
 BoxAnswers::BoxAnswers() {
@@ -53,7 +58,7 @@ void BoxAnswers::look() {
     if (!window->isActiveWindow()) {
         if (++looksInVain_ < MostLooksInVain) return;
         ADD_FAILURE() << "not in front: " << TextOf(*window);
-        window->close();
+        Dismiss(*window);
         return;
     }
     looksInVain_ = 0;
@@ -65,7 +70,7 @@ void BoxAnswers::look() {
         expected_.pop_front();
         act(*window);
     }
-    if (QApplication::activeModalWidget() == window) window->close();
+    if (QApplication::activeModalWidget() == window) Dismiss(*window);
     busy_ = false;
 }
 
