@@ -8,7 +8,6 @@
 #include <QListView>
 #include <QPushButton>
 #include <QStringListModel>
-#include <QTimer>
 
 #include "dictionary/editor_commands.h"
 #include "dictionary/listing.h"
@@ -83,10 +82,9 @@ void DictionaryEditor::makeLists() {
     ScreenReader::TellValueOf(StartingLetters, "Starting letters");
     StartingLetters->setMaxVisibleItems(PrefixesInView);
     connect(StartingLetters, &QComboBox::currentIndexChanged, this,
-            &DictionaryEditor::listChosenPrefix);
-    connect(StartingLetters, &QComboBox::activated, this, [this] {
-        if (!listed_) Dictionary::ListWords();  // the same one again
-    });
+            [] { Dictionary::ListWords(); });
+    // Choosing the same prefix again changes nothing in the box, but the words may be others.
+    connect(StartingLetters, &QComboBox::activated, this, [] { Dictionary::ListWords(); });
 
     WordCount = MakeLabel(client_, "WordCount", {4080, 240, 1815, 255},
                           LayoutFont(Typeface::SansSerif, 12));
@@ -113,14 +111,6 @@ void DictionaryEditor::makeWordEntry() {
     NewWord->setAccessibleName("New word");
     Add = MakeButton(client_, "Add", {4320, 6600, 1335, 495}, Qt::Key_A);
     connect(Add, &QPushButton::clicked, this, [] { Dictionary::AddNewWord(); });
-}
-
-// The player's choice of another prefix changes the index first, and is then
-// reported as a choice as well.
-void DictionaryEditor::listChosenPrefix() {
-    Dictionary::ListWords();
-    listed_ = true;
-    QTimer::singleShot(0, this, [this] { listed_ = false; });
 }
 
 void DictionaryEditor::closeEvent(QCloseEvent* event) {

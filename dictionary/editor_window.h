@@ -39,7 +39,5 @@ class DictionaryEditor : public QWidget {
     void makeMenu();
     void makeLists();
     void makeWordEntry();
-    void listChosenPrefix();
     QWidget* client_ = nullptr;  ///< what lies below the menu bar
-    bool listed_ = false;        ///< the event being handled has listed the prefix chosen
 };
