@@ -71,7 +71,7 @@ inline void WriteLetters(PackedWord word, std::size_t length, char* to) {
     } else if (length >= 4) {
         write(__builtin_bswap32(static_cast<std::uint32_t>(word >> 96)),
               __builtin_bswap32(static_cast<std::uint32_t>(end)));
-    } else {
+    } else if (length >= 2) {
         write(__builtin_bswap16(static_cast<std::uint16_t>(word >> 112)),
               __builtin_bswap16(static_cast<std::uint16_t>(end)));
     }
