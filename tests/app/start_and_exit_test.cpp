@@ -1,7 +1,19 @@
 // What the program asks when it starts and when it ends.
 #include <quorle/word_engine.h>
 
+#include <unistd.h>
+
+#include <QApplication>
+#include <QSessionManager>
+#include <csignal>
+
+#include "platform/session_end.h"
 #include "support/program_fixture.h"
+
+// Without a session the platform would say no.
+bool QSessionManager::allowsInteraction() {
+    return true;
+}
 
 namespace {
 
@@ -94,6 +106,28 @@ TEST_F(StartAndExit, AChangeIsSavedOrDropped) {
     press("Exit");
     EXPECT_EQ(stored("TimeLimit") + "/" + stored("MaxWordSize"), "60/12");
     EXPECT_EQ(wordsInFile(), 1);
+}
+
+TEST_F(StartAndExit, ASessionThatEndsAsksOnceAndBelowAnOpenBoxNotAtAll) {
+    makeDictionary({"cat"});
+    launch();
+    FollowSessionEnd([this] { control("Main")->close(); });
+    const auto endSession = [] {
+        emit qApp->commitDataRequest(*qApp->findChild<QSessionManager*>());
+    };
+    changeDictionary();
+    const auto endBelowTheQuestion = [&] {
+        alarm(5);  // a second question below the first would wait for ever
+        boxes_.expectModal([&](QWidget& /*question*/) { endSession(); });
+        press("Exit");
+    };
+    EXPECT_EXIT(endBelowTheQuestion(), testing::KilledBySignal(SIGTERM), "");
+    EXPECT_EQ(stored("MaxWordSize"), "");
+
+    expectSaveQuestion(QMessageBox::Yes);
+    endSession();
+    EXPECT_FALSE(isShown("Main"));
+    EXPECT_EQ(wordsInFile(), 2);
 }
 
 }  // namespace
