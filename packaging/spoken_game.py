@@ -9,7 +9,7 @@ from pathlib import Path
 
 from desktop_player import Program, listed_words, press, traced_words, type_text, wait_for
 
-QUIET = 2  # seconds without a word after which a situation is over
+QUIET = 3  # seconds without a word after which a situation is over
 
 
 class Reader:
@@ -62,7 +62,8 @@ class Player:
         print(f"| {situation} | {' / '.join(self.reader.news())} |", flush=True)
 
     def wait_for_words(self, situation, words, seconds):
-        wait_for(words, lambda: any(words in line for line in self.reader.lines()), seconds)
+        heard = self.reader.heard
+        wait_for(words, lambda: any(words in line for line in self.reader.lines()[heard:]), seconds)
         self.hear(situation)
 
 
@@ -124,7 +125,7 @@ def change_options(player):
     player.hear("OK", "Tab", "space")
 
 
-def edit_dictionary(player):
+def edit_dictionary(program, player):
     player.hear("Alt+D", "alt+d")
     player.hear("a new word: zzyzx", "Return", text="zzyzx")
     player.hear("to the prefixes", "Tab", "Tab")
@@ -136,9 +137,10 @@ def edit_dictionary(player):
     letters = "abcdefghijklmnopqrstuvwxyz"
     words.write_text("".join(f"qj{a}{b}{c}{d}\n" for a in letters for b in letters
                              for c in letters for d in letters))
-    player.hear("Alt: menu bar", "alt")
+    program.press("Dictionary Editor", "File")  # by mouse: Alt alone is not always heeded here
+    player.hear("the File menu")
+    player.hear("Down, Down", "Down", "Down")
     player.hear("Return", "Return")
-    player.hear("Down to Merge, Return", "Down", "Return")
     player.hear("the file's name", text=str(words))
     player.hear("Return", "Return")
     player.hear("a while later")
@@ -177,7 +179,7 @@ def main(executable):
         play(program, player)
         look_at_results(player)
         change_options(player)
-        edit_dictionary(player)
+        edit_dictionary(program, player)
         read_help(player)
         let_time_run_out(player)
         player.hear("Alt+X", "alt+x")

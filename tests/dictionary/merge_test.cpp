@@ -74,6 +74,8 @@ TEST_F(Merging, AGameGoesOnMeanwhileAndKeepsTheKeys) {
     EXPECT_TRUE(isShown("DictionaryEditor"));
     EXPECT_EQ(prefixes().currentText().toStdString(), "AA");
     EXPECT_EQ(cNumberOfWords(), ManyWords + 4);
+    EXPECT_EQ(std::count(told_.begin(), told_.end(), "merging"), 1);
+    EXPECT_EQ(std::count(told_.begin(), told_.end(), "merged. 300004 words"), 1);
     EXPECT_TRUE(comesToFront("Main"));
     key(Qt::Key_Return);
     EXPECT_EQ(words("Main/WordList"), Words{"cat"});
