@@ -82,12 +82,16 @@ void Tell(const std::string& text) {
 }
 
 void TellValueOf(QComboBox* box, const QString& description) {
+#if QT_VERSION >= QT_VERSION_CHECK(6, 8, 0)
+    box->setAccessibleDescription(description);  // the toolkit tells the value itself
+#else
     const auto tell = [box, description](const QString& value) {
         box->setAccessibleDescription(value + ". " + description);
         if (box->hasFocus() && !value.isEmpty()) Platform::Tell(value.toStdString());
     };
     tell(box->currentText());
     QObject::connect(box, &QComboBox::currentTextChanged, box, tell);
+#endif
 }
 
 }  // namespace ScreenReader

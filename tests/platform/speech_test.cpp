@@ -13,6 +13,8 @@ namespace {
 
 constexpr const char* Rows = "C, A, T, S. B, O, N, E. W, I, L, D. H, E, F, Y";
 
+constexpr bool ToolkitTellsBoxes = QT_VERSION >= QT_VERSION_CHECK(6, 8, 0);
+
 class Heard : public PlayedBoard {
   protected:
     /// What was told since the last call.
@@ -20,6 +22,10 @@ class Heard : public PlayedBoard {
     Words entering(const std::string& word) {
         enter({word});
         return heard();
+    }
+    /// What is told of a box where the toolkit does not tell it already.
+    static Words unlessToolkit(const std::string& value) {
+        return ToolkitTellsBoxes ? Words{} : Words{value};
     }
     static std::string description(QWidget* control) {
         return QAccessible::queryAccessibleInterface(control)
@@ -99,14 +105,16 @@ TEST_F(Heard, OptionsAndTheEditorsWords) {
     press("Options");
     control("WordSizeCombo")->setFocus();
     key(Qt::Key_Up);
-    EXPECT_EQ(heard(), Words{"15 letters"});
-    EXPECT_EQ(description(control("WordSizeCombo")).substr(0, 11), "15 letters.");
-    EXPECT_EQ(description(control("MinWordSizeCombo")).substr(0, 10), "3 letters.");
+    EXPECT_EQ(heard(), unlessToolkit("15 letters"));
+    if (!ToolkitTellsBoxes) {
+        EXPECT_EQ(description(control("WordSizeCombo")).substr(0, 11), "15 letters.");
+        EXPECT_EQ(description(control("MinWordSizeCombo")).substr(0, 10), "3 letters.");
+    }
     press("Dictionary");
     EXPECT_EQ(heard(), Words{});
     control("StartingLetters")->setFocus();
     key(Qt::Key_Down);
-    EXPECT_EQ(heard(), Words{"CA"});
+    EXPECT_EQ(heard(), unlessToolkit("CA"));
     control("DictionaryEditor/NewWord")->setFocus();
     EXPECT_EQ(entering("zoo"), Words{"zoo added. 10 words"});
     select("DictionaryEditor/WordList", "cat");
