@@ -26,6 +26,14 @@ constexpr std::array<std::uint32_t, 256> MakeTable() {
 
 constexpr auto Table = MakeTable();
 
+std::uint32_t ByTable(std::uint32_t crc, std::span<const std::byte> bytes) {
+    crc = ~crc;
+    for (const std::byte byte : bytes) {
+        crc = (crc >> 8) ^ Table[(crc ^ std::to_integer<std::uint32_t>(byte)) & 0xff];
+    }
+    return ~crc;
+}
+
 #if defined(__x86_64__)
 [[gnu::target("sse4.2")]] std::uint32_t ByInstruction(std::uint32_t crc,
                                                       std::span<const std::byte> bytes) {
@@ -35,25 +43,17 @@ constexpr auto Table = MakeTable();
         std::memcpy(&eight, bytes.data(), sizeof eight);
         wide = _mm_crc32_u64(wide, eight);
     }
-    return Crc32cByTable(~static_cast<std::uint32_t>(wide), bytes);
+    return ByTable(~static_cast<std::uint32_t>(wide), bytes);
 }
 #endif
 
 }  // namespace
 
-std::uint32_t Crc32cByTable(std::uint32_t crc, std::span<const std::byte> bytes) {
-    crc = ~crc;
-    for (const std::byte byte : bytes) {
-        crc = (crc >> 8) ^ Table[(crc ^ std::to_integer<std::uint32_t>(byte)) & 0xff];
-    }
-    return ~crc;
-}
-
 std::uint32_t Crc32c(std::uint32_t crc, std::span<const std::byte> bytes) {
 #if defined(__x86_64__)
     if (__builtin_cpu_supports("sse4.2")) return ByInstruction(crc, bytes);
 #endif
-    return Crc32cByTable(crc, bytes);
+    return ByTable(crc, bytes);
 }
 
 }  // namespace Quorle

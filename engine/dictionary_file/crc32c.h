@@ -9,7 +9,4 @@ namespace Quorle {
 /// Continues `crc` (0 at the start) over more bytes.
 std::uint32_t Crc32c(std::uint32_t crc, std::span<const std::byte> bytes);
 
-/// The same without the processor's own instruction.
-std::uint32_t Crc32cByTable(std::uint32_t crc, std::span<const std::byte> bytes);
-
 }  // namespace Quorle

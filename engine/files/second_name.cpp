@@ -13,32 +13,18 @@ namespace Quorle {
 // would replace what stands there; the folder's lock keeps other savers out meanwhile.
 bool SecondName::give(int folder, const std::string& name, const struct stat& file) {
     folder_ = folder;
-    first_ = second_ = name;
-    file_ = file.st_ino;
-    second_ += ".damaged";
-    for (int number = 2;; ++number) {
-        bool has = false;
-        if (isFree(has)) {
-            isNew_ = linkat(folder, name.c_str(), folder, second_.c_str(), 0) == 0;
-            if (isNew_) return true;
-            if (errno != EEXIST) break;
-        } else if (has || errno != 0) {
-            return has;  // by a save that was killed before it was through
-        }
-        second_ = name + ".damaged." + std::to_string(number);
+    first_ = name;
+    second_ = name + ".damaged";
+    struct stat other;
+    for (int number = 2; fstatat(folder, second_.c_str(), &other, AT_SYMLINK_NOFOLLOW) == 0;) {
+        if (other.st_ino == file.st_ino) return true;  // by a save that was killed
+        second_ = name + ".damaged." + std::to_string(number++);
     }
+    if (errno != ENOENT) return false;
+    isNew_ = linkat(folder, name.c_str(), folder, second_.c_str(), 0) == 0;
+    if (isNew_ || errno == EEXIST) return isNew_;
     isOnly_ = renameat(folder, name.c_str(), folder, second_.c_str()) == 0;
     return isOnly_;
-}
-
-/// Otherwise `has` tells whether the name is the file's already; with errno when that is unknown.
-bool SecondName::isFree(bool& has) const {
-    struct stat other;
-    const bool stands = fstatat(folder_, second_.c_str(), &other, AT_SYMLINK_NOFOLLOW) == 0;
-    if (!stands) return errno == ENOENT;
-    has = other.st_ino == file_;
-    errno = 0;
-    return false;
 }
 
 void SecondName::takeBack() const {

@@ -16,12 +16,9 @@ class SecondName {
     void takeBack() const;
 
   private:
-    bool isFree(bool& has) const;
-
     int folder_ = -1;
     std::string first_;
     std::string second_;
-    ino_t file_ = 0;
     bool isNew_ = false;
     bool isOnly_ = false;  // the file has moved to its second name
 };

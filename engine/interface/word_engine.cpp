@@ -212,9 +212,10 @@ int32_t cCheckForAllDefinedWords(const char* board) {
 int32_t cGetDefinedWord(int32_t i, char* buffer, int32_t* n) {
     if (n == nullptr) return 0;
     *n = 0;
-    LastSearch& found = State.found;
-    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= found.words.size()) return 0;
+    const std::size_t count = State.found.words.size();
+    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= count) return 0;
     return Guarded(0, [&] {
+        LastSearch& found = State.found;
         if (!found.speller) {
             SortFound(found.words, found.room);
             found.speller.emplace(found.board);

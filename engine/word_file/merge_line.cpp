@@ -14,19 +14,33 @@ using Clock = std::chrono::steady_clock;
 constexpr std::chrono::microseconds StepTime{3500};
 constexpr double ReadingShare = 0.4;  // of a file's time; the rest is building
 
+// Someone who changes the dictionary at every step must not keep the merge from ending: the last
+// attempt is made at one go.
+constexpr int MaxAttempts = 8;
+
 }  // namespace
 
 /// Does a piece of the current file's work.
 void MergeLine::workOnce() {
     using Progress = WordFileReader::Progress;
     if (build_) {
-        if (build_->work()) endCurrent();
+        const auto built = build_->work();
+        if (built == MergedDictionary::Progress::Done) endCurrent();
+        if (built == MergedDictionary::Progress::Outdated) beginAnew();
         return;
     }
     const Progress progress = current_->readOn();
     if (progress == Progress::Failed) endCurrent();
     if (progress != Progress::Done) return;
-    build_ = std::make_unique<MergedDictionary>(dictionary_, current_->words());
+    build_ = std::make_unique<MergedDictionary>(dictionary_, current_->takeWords());
+}
+
+/// The words read are given back already: the file is read again.
+void MergeLine::beginAnew() {
+    build_.reset();
+    current_->rewind();
+    const bool atOneGo = ++outdated_ >= MaxAttempts;
+    for (const int done = done_; atOneGo && done == done_;) workOnce();
 }
 
 /// The part of the current file that is done, 0..1.
@@ -54,6 +68,7 @@ bool MergeLine::beginNext() {
 void MergeLine::endCurrent() {
     build_.reset();
     current_.reset();
+    outdated_ = 0;
     ++done_;
 }
 

@@ -24,6 +24,7 @@ class MergeLine {
     void endCurrent();
     bool work();
     void workOnce();
+    void beginAnew();
     double fraction() const;
     std::int32_t percent();
 
@@ -31,6 +32,7 @@ class MergeLine {
     std::unique_ptr<WordFileReader> current_;
     std::unique_ptr<MergedDictionary> build_;  // once all of the current file is read
     std::deque<std::string> waiting_;
+    int outdated_ = 0;  // how often the current one had to begin anew
     int done_ = 0;
     std::int32_t percent_ = 0;
 };

@@ -1,5 +1,7 @@
 #include "word_file/sorted_words.h"
 
+#include <utility>
+
 namespace Quorle {
 
 void SortedWords::endChunk() {
@@ -13,13 +15,13 @@ void SortedWords::endChunk() {
     chunk_.reserve(ChunkSize);
 }
 
-SortedWordsReader::SortedWordsReader(const SortedWords& words) : words_(&words) {
-    const std::size_t runs = words.runs_.size();
+SortedWordsReader::SortedWordsReader(SortedWords words) : words_(std::move(words)) {
+    const std::size_t runs = words_.runs_.size();
     for (std::size_t run = 0; run < runs; ++run) {
-        const std::size_t chunk = words.runs_[run];
-        const std::size_t end = run + 1 < runs ? words.runs_[run + 1] : words.chunks_.size();
-        const std::vector<PackedWord>& first = words.chunks_[chunk];
-        heads_.push_back({first.data(), first.data() + first.size(), chunk, end});
+        const std::size_t chunk = words_.runs_[run];
+        const std::size_t end = run + 1 < runs ? words_.runs_[run + 1] : words_.chunks_.size();
+        const std::vector<PackedWord>& first = words_.chunks_[chunk];
+        heads_.push_back({first.front(), first.data(), first.data() + first.size(), chunk, end});
     }
     for (std::size_t place = heads_.size() / 2; place-- > 0;) sink(place);
 }
@@ -27,8 +29,8 @@ SortedWordsReader::SortedWordsReader(const SortedWords& words) : words_(&words) 
 void SortedWordsReader::sink(std::size_t place) {
     const Head head = heads_[place];
     for (std::size_t child = 2 * place + 1; child < heads_.size(); child = 2 * place + 1) {
-        if (child + 1 < heads_.size() && *heads_[child + 1].word < *heads_[child].word) ++child;
-        if (*head.word <= *heads_[child].word) break;
+        if (child + 1 < heads_.size() && heads_[child + 1].word < heads_[child].word) ++child;
+        if (head.word <= heads_[child].word) break;
         heads_[place] = heads_[child];
         place = child;
     }
@@ -36,18 +38,21 @@ void SortedWordsReader::sink(std::size_t place) {
 }
 
 /// False at the end of the run.
-bool SortedWordsReader::advance(Head& head) const {
-    if (++head.word != head.chunkEnd) return true;
-    if (++head.chunk == head.end) return false;
-    const std::vector<PackedWord>& chunk = words_->chunks_[head.chunk];
-    head.word = chunk.data();
-    head.chunkEnd = chunk.data() + chunk.size();
+bool SortedWordsReader::advance(Head& head) {
+    if (++head.at == head.chunkEnd) {
+        words_.chunks_[head.chunk] = {};
+        if (++head.chunk == head.end) return false;
+        const std::vector<PackedWord>& chunk = words_.chunks_[head.chunk];
+        head.at = chunk.data();
+        head.chunkEnd = head.at + chunk.size();
+    }
+    head.word = *head.at;
     return true;
 }
 
 bool SortedWordsReader::next(PackedWord& word) {
     while (!heads_.empty()) {
-        word = *heads_.front().word;
+        word = heads_.front().word;
         if (!advance(heads_.front())) {
             heads_.front() = heads_.back();
             heads_.pop_back();

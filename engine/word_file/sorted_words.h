@@ -30,11 +30,13 @@ class SortedWords {
     std::size_t size_ = 0;
 };
 
-/// The words in strictly ascending order. They stay the caller's, and finished.
+/// The words in strictly ascending order. Memory is given back as they are read: at once it would
+/// take long.
 class SortedWordsReader {
   public:
     SortedWordsReader() = default;
-    explicit SortedWordsReader(const SortedWords& words);
+    /// The words are finished.
+    explicit SortedWordsReader(SortedWords words);
 
     /// The next word; false at the end.
     bool next(PackedWord& word);
@@ -42,16 +44,17 @@ class SortedWordsReader {
   private:
     /// The next word of a run, and where it goes on.
     struct Head {
-        const PackedWord* word;
+        PackedWord word;
+        const PackedWord* at;
         const PackedWord* chunkEnd;
         std::size_t chunk;
         std::size_t end;
     };
 
     void sink(std::size_t place);
-    bool advance(Head& head) const;
+    bool advance(Head& head);
 
-    const SortedWords* words_ = nullptr;
+    SortedWords words_;
     std::vector<Head> heads_;  // a heap, the smallest word first
     PackedWord last_ = 0;
 };

@@ -26,6 +26,12 @@ bool WordFileReader::open(const char* path) {
     return static_cast<bool>(file_);
 }
 
+void WordFileReader::rewind() {
+    lseek(file_.number(), 0, SEEK_SET);
+    left_ = size_;
+    used_ = 0;
+}
+
 WordFileReader::Progress WordFileReader::readOn() {
     const std::size_t size = std::min(left_, BlockSize);
     std::size_t got = 0;

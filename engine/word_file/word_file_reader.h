@@ -1,5 +1,6 @@
 #pragma once
 // Reading a word file block by block.
+#include <utility>
 #include <vector>
 
 #include "files/file_descriptor.h"
@@ -21,7 +22,9 @@ class WordFileReader {
     /// The part of the file that has been read, 0..1.
     double fraction() const;
 
-    const SortedWords& words() const { return words_; }
+    /// The words of the file, once; and reading it anew.
+    SortedWords takeWords() { return std::exchange(words_, {}); }
+    void rewind();
 
   private:
     void readWords();

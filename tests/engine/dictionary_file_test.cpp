@@ -109,11 +109,4 @@ TEST(DictionaryFile, HostileContentIsRefused) {
     }
 }
 
-TEST(Crc32c, IsTheSameBothWays) {
-    for (std::size_t size = 0; size < 40; ++size) {
-        const std::vector<std::byte> bytes(size, std::byte(7));
-        EXPECT_EQ(Crc32c(7, bytes), Crc32cByTable(7, bytes));
-    }
-}
-
 }  // namespace
