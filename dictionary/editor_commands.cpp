@@ -53,6 +53,7 @@ void OpenEditor() {
     ListStartingLetters(True);
     SetDefaultButton(&editor, editor.Add);
     ListWords();
+    editor.waitsForGameEnd = false;
     WindowFront::Bring(editor);
     editor.NewWord->setFocus();
 }

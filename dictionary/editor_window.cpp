@@ -17,6 +17,7 @@
 #include "platform/list_keys.h"
 #include "platform/menu_bar.h"
 #include "platform/screen_reader.h"
+#include "platform/window_size.h"
 #include "state/game_rules.h"
 #include "state/windows.h"
 
@@ -73,7 +74,7 @@ void DictionaryEditor::makeMenu() {
     SaveAs = addCommand("SaveAs", "Save As", Dictionary::SaveAsText);
     Exit = addCommand("Exit", "Exit", Dictionary::LeaveEditor);
     FillBelow(bar, client_);
-    layout()->setSizeConstraint(QLayout::SetFixedSize);
+    SetOnlySize(*layout());
 }
 
 void DictionaryEditor::makeLists() {

@@ -5,6 +5,7 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QLabel>
+#include <QLineEdit>
 #include <QListView>
 #include <QSignalBlocker>
 #include <QStringListModel>
@@ -12,6 +13,7 @@
 
 #include "dictionary/editor_window.h"
 #include "platform/layout.h"
+#include "platform/platform.h"
 #include "state/windows.h"
 
 namespace {
@@ -85,13 +87,21 @@ void ListWords() {
 void ShowEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     if (editor.isVisible()) return;
-    // A box that has just been opened is not yet the active window.
-    QWidget* box = QApplication::activeModalWidget();
-    QWidget* inFront = box != nullptr ? box : QApplication::activeWindow();
-    const bool behind = box != nullptr || State.TimeRemaining != 0;
-    editor.setAttribute(Qt::WA_ShowWithoutActivating, behind);
-    editor.show();
-    if (behind && inFront != nullptr) inFront->activateWindow();
+    const bool playing = State.TimeRemaining != 0;
+    editor.waitsForGameEnd = playing && Platform::OnWayland();
+    if (editor.waitsForGameEnd) return;
+    editor.NewWord->setFocus();
+    const bool boxIsUp = QApplication::activeModalWidget() != nullptr;
+    if (playing || boxIsUp || !WindowFront::IsOurs()) {
+        WindowFront::ShowBehind(editor);
+    } else {
+        WindowFront::Bring(editor);
+    }
+}
+
+void ShowWaitingEditor() {
+    if (Windows::Existing<DictionaryEditor> == nullptr) return;
+    if (Windows::Existing<DictionaryEditor>->waitsForGameEnd) ShowEditor();
 }
 
 }  // namespace Dictionary

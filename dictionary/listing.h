@@ -14,8 +14,12 @@ void ListStartingLetters(Boolean ResetSelection);
 /// the editor.
 void ListWords();
 
-/// Shows the editor where it is hidden. During a game or a message box it takes
-/// no focus: what the player types belongs there.
+/// Shows the editor where it is hidden. During a game, a message box or behind
+/// another program it takes no focus: what the player types belongs there. Where
+/// it cannot but take it, it waits for the game's end.
 void ShowEditor();
+
+/// Shows the editor where it waits for the game's end.
+void ShowWaitingEditor();
 
 }  // namespace Dictionary

@@ -3,10 +3,12 @@
 #include <QEvent>
 #include <QLabel>
 #include <QTimer>
+#include <QWindow>
 
 #include "dictionary/merge.h"
 #include "main_window/main_window.h"
 #include "platform/layout.h"
+#include "platform/platform.h"
 #include "state/windows.h"
 
 namespace {
@@ -25,12 +27,17 @@ void Fill(QLabel& label, const QColor& colour) {
     label.setAutoFillBackground(true);
 }
 
+// On Wayland every window gets the focus when it is shown, but no tool tip.
+Qt::WindowType Kind() {
+    return Platform::OnWayland() ? Qt::ToolTip : Qt::Window;
+}
+
 }  // namespace
 
 Progress::Progress() {
     setObjectName("Progress");
     setWindowTitle("Quorle Progress");
-    setWindowFlags(Qt::Window | Qt::FramelessWindowHint | Qt::WindowDoesNotAcceptFocus);
+    setWindowFlags(Kind() | Qt::FramelessWindowHint | Qt::WindowDoesNotAcceptFocus);
     setAttribute(Qt::WA_ShowWithoutActivating);
     setFixedSize(Twips(ClientWidth), Twips(ClientHeight));
     setFrameStyle(QFrame::Box | QFrame::Plain);
@@ -46,8 +53,12 @@ Progress::Progress() {
 }
 
 void Progress::Display() {
-    const QRect main = Windows::Shared<Main>().frameGeometry();
-    move(main.center() - rect().center());
+    const Main& main = Windows::Shared<Main>();
+    move(main.frameGeometry().center() - rect().center());
+    if (Platform::OnWayland()) {
+        winId();
+        windowHandle()->setTransientParent(main.windowHandle());
+    }
     show();
     raise();
 }

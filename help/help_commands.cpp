@@ -12,7 +12,9 @@ namespace Common {
 
 void OpenHelp() {
     ShowHelpPage();
-    WindowFront::Bring(Windows::Shared<HelpBrowser>());
+    HelpBrowser& window = Windows::Shared<HelpBrowser>();
+    WindowFront::Float(window);
+    WindowFront::Bring(window);
 }
 
 void ShowHelpPage() {

@@ -19,6 +19,7 @@
 #include "platform/layout.h"
 #include "platform/platform.h"
 #include "platform/window_accessible.h"
+#include "platform/window_size.h"
 
 namespace {
 
@@ -47,7 +48,7 @@ Main::Main() {
     setWindowTitle(Platform::ProgramTitle);
     setWindowFlags(Qt::Window | Qt::WindowTitleHint | Qt::WindowSystemMenuHint |
                    Qt::WindowMinimizeButtonHint | Qt::WindowCloseButtonHint);
-    setFixedSize(Twips(ClientWidth), Twips(ClientHeight));
+    SetOnlySize(*this, {Twips(ClientWidth), Twips(ClientHeight)});
     MakeWindowsAccessible();
     makeToolBar();
     makeBoard();

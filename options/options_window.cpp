@@ -12,6 +12,7 @@
 #include "options/options_commands.h"
 #include "platform/layout.h"
 #include "platform/screen_reader.h"
+#include "platform/window_size.h"
 
 namespace {
 
@@ -63,7 +64,7 @@ OptionsDialog::OptionsDialog() {
     setWindowTitle("Options");
     setWindowFlags(Qt::Window | Qt::WindowTitleHint | Qt::WindowSystemMenuHint |
                    Qt::WindowCloseButtonHint);
-    setFixedSize(ClientWidth, ClientHeight);
+    SetOnlySize(*this, {ClientWidth, ClientHeight});
     makeButtons();
     makeBoxes();
     makeLabels();

@@ -1,4 +1,6 @@
 // The desktop's own functions behind the platform's names.
+#include <QGuiApplication>
+
 #include "platform/file_dialog.h"
 #include "platform/message_box.h"
 #include "platform/platform.h"
@@ -17,6 +19,7 @@ void UseDesktop() {
     WarningSound = WarningSound::Play;
     Tell = ScreenReader::Tell;
     WindowInFront = WindowFront::Number;
+    OnWayland = [] { return QGuiApplication::platformName().startsWith("wayland"); };
     ProgramFolder = [folder = FindProgramFolder()] { return folder; };
 }
 

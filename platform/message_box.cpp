@@ -5,6 +5,7 @@
 #include <QMessageBox>
 
 #include "platform/window_front.h"
+#include "platform/window_size.h"
 
 namespace {
 
@@ -27,6 +28,7 @@ QMessageBox::StandardButton Run(const std::string& text, const std::string& titl
             buttons, WindowFront::Latest());
     box.setTextFormat(Qt::PlainText);
     box.setWindowModality(Qt::ApplicationModal);
+    LetGrow(box);
     box.exec();
     const auto pressed = box.standardButton(box.clickedButton());
     box.hide();

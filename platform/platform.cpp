@@ -45,6 +45,7 @@ std::function<std::string(const std::string&)> ChooseFileToSave = [](const std::
 std::function<void()> WarningSound = [] {};
 std::function<void(const std::string&)> Tell = [](const std::string&) {};
 std::function<std::int32_t()> WindowInFront = [] { return 0; };
+std::function<bool()> OnWayland = [] { return false; };
 std::function<void()> SeedRandom = SeedFromTimeOfDay;
 std::function<float()> RandomNumber = DrawNumber;
 std::function<double()> SteadySeconds = SecondsSinceBoot;

@@ -32,6 +32,10 @@ extern std::function<void(const std::string& text)> Tell;
 /// when none is; negative while a message or file dialog of that window is.
 extern std::function<std::int32_t()> WindowInFront;
 
+/// Whether a Wayland compositor shows the windows: it alone decides which has the
+/// focus, and gives it to what is shown.
+extern std::function<bool()> OnWayland;
+
 /// Seeds the random source from the time of day; draws a number in [0, 1).
 extern std::function<void()> SeedRandom;
 extern std::function<float()> RandomNumber;

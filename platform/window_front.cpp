@@ -8,6 +8,8 @@
 #include <algorithm>
 #include <array>
 
+#include "platform/platform.h"
+
 namespace {
 
 // A window's number is its place here, from 1. A native window handle would not
@@ -17,6 +19,9 @@ constexpr std::array Names{"Main",     "OptionsDialog", "Results", "DictionaryEd
 
 QList<QPointer<QWidget>> Followed;  // latest in front first
 
+// Activated by us, but not yet by the desktop: the next window may hide before.
+QPointer<QWidget> Asked;
+
 class ActivationFilter : public QObject {
   public:
     bool eventFilter(QObject* receiver, QEvent* event) override {
@@ -24,6 +29,7 @@ class ActivationFilter : public QObject {
         auto* window = static_cast<QWidget*>(receiver);
         Followed.removeAll(window);
         Followed.prepend(window);
+        Asked.clear();
         return false;
     }
 };
@@ -40,6 +46,26 @@ bool CanBeInFront(const QWidget* window) {
            !window->windowFlags().testFlag(Qt::WindowDoesNotAcceptFocus);
 }
 
+void Ask(QWidget& window) {
+    if (!window.isActiveWindow()) Asked = &window;
+    window.raise();
+    window.activateWindow();
+}
+
+QWidget* InFront() {
+    // A box that has just been opened is not yet the active window.
+    if (QWidget* box = QApplication::activeModalWidget()) return box;
+    return Asked != nullptr && Asked->isVisible() ? Asked.data() : QApplication::activeWindow();
+}
+
+// The native window is told once, when it is made; it looks at each showing.
+void SetShownBehind(QWidget& window, bool behind) {
+    window.setAttribute(Qt::WA_ShowWithoutActivating, behind);
+    if (QWindow* handle = window.windowHandle()) {
+        handle->setProperty("_q_showWithoutActivating", behind);
+    }
+}
+
 }  // namespace
 
 namespace WindowFront {
@@ -52,15 +78,17 @@ void Follow(QWidget* window) {
 }
 
 void Bring(QWidget& window) {
+    // A window shown anew is the only one that every compositor puts in front.
+    if (Platform::OnWayland() && InFront() != &window) window.hide();
     window.setWindowState(window.windowState() & ~Qt::WindowMinimized);
+    SetShownBehind(window, false);
     window.show();
-    window.raise();
-    window.activateWindow();
+    Ask(window);
     window.setAttribute(Qt::WA_KeyboardFocusChange);  // shows the focus before the first Tab
 }
 
 void Hide(QWidget& window) {
-    const bool wasInFront = window.isActiveWindow();
+    const bool wasInFront = window.isActiveWindow() || Asked == &window;
     window.hide();
     // Without a place of its own the window manager would choose another next time.
     if (QWindow* handle = window.windowHandle()) handle->setFramePosition(window.pos());
@@ -68,10 +96,36 @@ void Hide(QWidget& window) {
 }
 
 void GiveBack() {
-    if (QWidget* window = Latest()) {
-        window->raise();
-        window->activateWindow();
+    if (QWidget* window = Latest()) Ask(*window);
+}
+
+void ShowBehind(QWidget& window) {
+    QWidget* inFront = InFront();
+    SetShownBehind(window, true);
+    window.show();
+    if (inFront != nullptr) {
+        inFront->activateWindow();
+    } else {
+        QApplication::alert(&window);
     }
+}
+
+bool IsOurs() {
+    return InFront() != nullptr;
+}
+
+bool DesktopTiles() {
+    return qEnvironmentVariableIsSet("I3SOCK");
+}
+
+void Float(QWidget& window) {
+    const auto main = std::find_if(Followed.begin(), Followed.end(), [](const auto& followed) {
+        return followed != nullptr && NumberOf(followed) == 1;
+    });
+    if (!DesktopTiles() || main == Followed.end()) return;
+    if (window.windowType() != Qt::Dialog) window.setWindowFlags(Qt::Dialog);
+    window.winId();
+    window.windowHandle()->setTransientParent((*main)->windowHandle());
 }
 
 QWidget* Latest() {

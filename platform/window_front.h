@@ -16,6 +16,19 @@ void Bring(QWidget& window);
 /// Hides a window, which keeps its place; when it was in front, gives the front back.
 void Hide(QWidget& window);
 
+/// Shows a hidden window behind what is in front, which keeps the focus; with
+/// another program in front it calls for attention.
+void ShowBehind(QWidget& window);
+
+/// Whether the front is ours, or has been asked for.
+bool IsOurs();
+
+/// Whether windows are tiled. Those with an owner float.
+bool DesktopTiles();
+
+/// Where windows are tiled, lets this one float above the main window.
+void Float(QWidget& window);
+
 /// Activates the window that was in front last and is still shown, else the
 /// main window. For when something in front has gone.
 void GiveBack();

@@ -11,6 +11,7 @@
 #include <array>
 
 #include "dictionary/dictionary.h"
+#include "dictionary/listing.h"
 #include "main_window/main_window.h"
 #include "platform/platform.h"
 #include "results/result_lists.h"
@@ -90,6 +91,8 @@ void EndGame(const char* why) {
     results.placeBeside(window);
     results.ResultsOK->setAccessibleDescription(why + (". " + SummaryText()));
     results.ResultsOK->setFocus();
+    Dictionary::ShowWaitingEditor();
+    WindowFront::Float(results);
     WindowFront::Bring(results);
     UpdateResultLabels();
 }

@@ -1,5 +1,6 @@
 #include <QApplication>
 #include <QTimer>
+#include <QWindow>
 
 #include "dictionary/editor_fixture.h"
 #include "platform/platform.h"
@@ -79,6 +80,50 @@ TEST_F(Merging, AGameGoesOnMeanwhileAndKeepsTheKeys) {
     EXPECT_TRUE(comesToFront("Main"));
     key(Qt::Key_Return);
     EXPECT_EQ(words("Main/WordList"), Words{"cat"});
+}
+
+TEST_F(Merging, OutsideAGameTheEditorComesToTheFrontAlsoWhenFirstShownInAGame) {
+    Platform::ChooseFileToOpen = [](const std::string&) { return std::string(); };
+    relaunch();
+    start("CATSBONEWILDHEFY");
+    press("Dictionary");
+    EXPECT_TRUE(comesToFront("DictionaryEditor"));
+    closeByTitleBar("DictionaryEditor");
+    press("End");
+    press("ResultsOK");
+    press("Dictionary");
+    control("DictionaryEditor/Add")->setFocus();
+    mergeMany('a');
+    EXPECT_TRUE(comesToFront("Main"));
+    EXPECT_TRUE(QTest::qWaitFor([this] { return isShown("DictionaryEditor"); }, 60'000));
+    EXPECT_TRUE(comesToFront("DictionaryEditor"));
+    EXPECT_FALSE(
+        control("DictionaryEditor")->windowHandle()->property("_q_showWithoutActivating").toBool());
+    type("word");
+    EXPECT_EQ(text("DictionaryEditor/NewWord"), "word");
+}
+
+// There a window that is shown gets the focus, as it does in these tests.
+TEST_F(Merging, OnWaylandNothingThatWouldTakeTheFocusIsShownInAGame) {
+    Platform::OnWayland = [] { return true; };
+    bringToFront("Main");
+    start("CATSBONEWILDHEFY");
+    bringToFront("DictionaryEditor");
+    mergeMany('a');
+    EXPECT_EQ(control("Progress")->windowType(), Qt::ToolTip);
+    EXPECT_EQ(control("Progress")->windowHandle()->transientParent(),
+              control("Main")->windowHandle());
+    bringToFront("Main");
+    EXPECT_TRUE(QTest::qWaitFor([this] { return !isShown("Progress"); }, 60'000));
+    EXPECT_FALSE(isShown("DictionaryEditor"));
+    EXPECT_EQ(text("WordCount"), std::to_string(ManyWords + 4) + " words");
+    EXPECT_TRUE(control("Main")->isActiveWindow());
+    EXPECT_EQ(QApplication::focusWidget(), control("Main/NewWord"));
+    enter({"cat"});
+    EXPECT_EQ(words("Main/WordList"), Words{"cat"});
+    press("End");
+    EXPECT_TRUE(isShown("DictionaryEditor"));
+    EXPECT_TRUE(comesToFront("Results"));
 }
 
 TEST_F(Merging, ASecondFileWaitsInLine) {
