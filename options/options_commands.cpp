@@ -36,9 +36,8 @@ QString SelectedEntry(const QComboBox& box) {
 }
 
 std::optional<std::int16_t> SelectedSeconds(const QComboBox& box) {
-    const QString entry = SelectedEntry(box);
-    if (entry.isEmpty()) return std::nullopt;
-    return static_cast<std::int16_t>(60 * entry.left(1).toInt() + entry.mid(2).toInt());
+    if (box.currentIndex() < 0) return std::nullopt;
+    return GameTimes[static_cast<std::size_t>(box.currentIndex())];
 }
 
 std::optional<std::int16_t> SelectedLetters(const QComboBox& box) {
