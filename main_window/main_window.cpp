@@ -44,12 +44,12 @@ QFont SmallerFont() {
 }  // namespace
 
 Main::Main() {
+    MakeWindowsAccessible();  // first: the toolkit keeps what it made of a window once
     setObjectName("Main");
     setWindowTitle(Platform::ProgramTitle);
     setWindowFlags(Qt::Window | Qt::WindowTitleHint | Qt::WindowSystemMenuHint |
                    Qt::WindowMinimizeButtonHint | Qt::WindowCloseButtonHint);
     SetOnlySize(*this, {Twips(ClientWidth), Twips(ClientHeight)});
-    MakeWindowsAccessible();
     makeToolBar();
     makeBoard();
     makeWordEntry();

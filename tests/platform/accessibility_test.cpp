@@ -46,7 +46,7 @@ TEST_F(Accessibility, WhatCanBeUsedOrReadIsReachedFromItsWindowAndHasANameAndARo
     for (const char* opens : {"Options", "Dictionary", "HelpButton", "End"}) press(opens);
     for (const char* window :
          {"Main", "OptionsDialog", "DictionaryEditor", "HelpBrowser", "Results"}) {
-        EXPECT_EQ(told(control(window)).role(), QAccessible::Window);
+        EXPECT_EQ(told(control(window)).role(), QAccessible::Window) << window;
         EXPECT_EQ(told(control(window)).text(QAccessible::Name), control(window)->windowTitle());
         std::set<QObject*> reached;
         walk(told(control(window)), reached);
