@@ -21,21 +21,18 @@ class PlainSearch {
     void search(const std::string& letters, const Take& take) {
         Board board{};
         std::copy(letters.begin(), letters.end(), board.begin());
-        search_.search(content_.words, board, {}, found_);
-        SortFound(found_, room_);
-        const Speller spell(board);
-        for (const FoundWord& word : found_) {
+        search_->search(content_.words, board, {}, found_);
+        found_.finish(board);
+        for (std::size_t i = 0; i < found_.size(); ++i) {
             char text[LongestWord];
-            WriteLetters(spell(word), word.letters, text);
-            take(std::string_view(text, word.letters));
+            take(std::string_view(text, found_.spell(i, text)));
         }
     }
 
   private:
     DictionaryContent content_;
-    BoardSearch search_{Matching::Plain};
-    std::vector<FoundWord> found_;
-    std::vector<FoundWord> room_;
+    std::unique_ptr<BoardSearch> search_ = std::make_unique<BoardSearch>(Matching::Plain);
+    FoundWords found_;
 };
 
 }  // namespace

@@ -60,19 +60,21 @@ inline PackedWord LoadBytes(const std::byte* text) {
 /// Writes the word's letters, 2 to 16, and nothing behind them: by both ends, which may overlap.
 inline void WriteLetters(PackedWord word, std::size_t length, char* to) {
     static_assert(std::endian::native == std::endian::little);
-    const PackedWord end = word >> 8 * (LongestWord - length);
     const auto write = [to, length](auto first, auto last) {
         std::memcpy(to, &first, sizeof first);
         std::memcpy(to + length - sizeof last, &last, sizeof last);
     };
-    if (length >= 8) {
-        write(__builtin_bswap64(static_cast<std::uint64_t>(word >> 64)),
-              __builtin_bswap64(static_cast<std::uint64_t>(end)));
-    } else if (length >= 4) {
-        write(__builtin_bswap32(static_cast<std::uint32_t>(word >> 96)),
+    const auto high = static_cast<std::uint64_t>(word >> 64);
+    if (length > 8) {
+        const auto end = static_cast<std::uint64_t>(word >> 8 * (LongestWord - length));
+        return write(__builtin_bswap64(high), __builtin_bswap64(end));
+    }
+    const std::uint64_t end = high >> 8 * (8 - length);
+    if (length >= 4) {
+        write(__builtin_bswap32(static_cast<std::uint32_t>(high >> 32)),
               __builtin_bswap32(static_cast<std::uint32_t>(end)));
-    } else if (length >= 2) {
-        write(__builtin_bswap16(static_cast<std::uint16_t>(word >> 112)),
+    } else {
+        write(__builtin_bswap16(static_cast<std::uint16_t>(high >> 48)),
               __builtin_bswap16(static_cast<std::uint16_t>(end)));
     }
 }

@@ -100,14 +100,10 @@ Matching BestMatching() {
 
 /// Finds the words on a board that is 16 letters.
 void SearchBoard(std::string_view letters) {
-    LastSearch& found = State.found;
-    std::copy(letters.begin(), letters.end(), found.board.begin());
-    found.speller.reset();
-    // Out of memory, a search is left in its midst, and must not be used again.
-    auto search =
-        found.search ? std::move(found.search) : std::make_unique<BoardSearch>(BestMatching());
-    search->search(State.dictionary.words(), found.board, State.dictionary.limits, found.words);
-    found.search = std::move(search);
+    std::copy(letters.begin(), letters.end(), State.board.begin());
+    if (!State.search) State.search = std::make_unique<BoardSearch>(BestMatching());
+    const Dictionary& dictionary = State.dictionary;
+    State.search->search(dictionary.words(), State.board, dictionary.limits, State.found);
 }
 
 }  // namespace
@@ -198,31 +194,24 @@ int32_t cWriteTextFile(const char* path) {
 }
 
 int32_t cCheckForAllDefinedWords(const char* board) {
-    std::vector<FoundWord>& words = State.found.words;
-    words.clear();
-    const bool done = Guarded(false, [&] {
-        if (board == nullptr || Beginning(board).size() != Cubes) return false;
-        if (IsLetters(Beginning(board))) SearchBoard(Beginning(board));
-        return true;
+    const bool isFound = Guarded(false, [&] {
+        const std::string_view letters = board == nullptr ? "" : Beginning(board);
+        const bool isBoard = letters.size() == Cubes && IsLetters(letters);
+        if (isBoard) SearchBoard(letters);
+        return isBoard;
     });
-    if (!done) words.clear();
-    return static_cast<int32_t>(words.size());
+    if (!isFound) State.found.clear();
+    return static_cast<int32_t>(State.found.size());
 }
 
 int32_t cGetDefinedWord(int32_t i, char* buffer, int32_t* n) {
     if (n == nullptr) return 0;
     *n = 0;
-    const std::size_t count = State.found.words.size();
-    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= count) return 0;
+    FoundWords& found = State.found;
+    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= found.size()) return 0;
     return Guarded(0, [&] {
-        LastSearch& found = State.found;
-        if (!found.speller) {
-            SortFound(found.words, found.room);
-            found.speller.emplace(found.board);
-        }
-        const FoundWord& word = found.words[static_cast<std::size_t>(i)];
-        WriteLetters((*found.speller)(word), word.letters, buffer);
-        *n = static_cast<int32_t>(word.letters);
+        if (!found.isFinished()) found.finish(State.board);
+        *n = static_cast<int32_t>(found.spell(static_cast<std::size_t>(i), buffer));
         return 1;
     });
 }

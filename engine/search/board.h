@@ -12,11 +12,10 @@ namespace Quorle {
 inline constexpr std::uint32_t Cubes = 16;
 inline constexpr std::uint32_t Places = 2 * Cubes;
 inline constexpr std::uint32_t MostTouching = 8;
+inline constexpr std::uint32_t AllCubes = (1U << Cubes) - 1;
 
 /// The letters "a" to "z" of the cubes, row by row; "q" stands for the Qu cube.
 using Board = std::array<char, Cubes>;
-
-inline constexpr std::uint32_t NoLetter = 1U << 30;  // in no edge
 
 /// Bit i of each cube's: cube i touches it.
 inline constexpr auto Around = [] {
@@ -25,26 +24,51 @@ inline constexpr auto Around = [] {
         const std::uint32_t row = (cube % 4 > 0 ? 1U : 0) | 2 | (cube % 4 < 3 ? 4U : 0);
         const std::uint32_t rows = (row | row << 4 | row << 8) << cube % 4 >> 1;
         const std::uint32_t all = cube < 4 ? rows >> 4 : rows << (cube / 4 - 1) * 4;
-        around[cube] = all & 0xffff & ~(1U << cube);
+        around[cube] = all & AllCubes & ~(1U << cube);
     }
     return around;
 }();
 
-struct BoardPlaces {
-    std::array<std::uint32_t, Places> shown;       ///< the letter of each place, as a bit
-    std::array<std::uint32_t, Places> touching{};  ///< bit i: place i can follow
+/// What a chain that goes on to a place needs to know of it.
+struct alignas(16) Place {
+    std::uint64_t cube;      ///< 0..15
+    std::uint32_t below;     ///< the bits of the letters before its own
+    std::uint32_t touching;  ///< bit i: place i can follow
+    std::uint32_t kept[4];   ///< what a chain keeps of its edge's fields
+};
 
-    explicit BoardPlaces(const Board& board) {
-        shown.fill(NoLetter);
+class BoardPlaces {
+  public:
+    BoardPlaces() {
         for (std::uint32_t cube = 0; cube < Cubes; ++cube) {
-            shown[cube] = 1U << (board[cube] - 'a');
-            touching[cube] = Around[cube];
-            if (board[cube] != 'q') continue;
-            shown[Cubes + cube] = 1U << ('u' - 'a');
-            touching[Cubes + cube] = Around[cube];
-            touching[cube] = 1U << (Cubes + cube);
+            places_[cube] = {cube, 0, 0, {0, 0, ~0U, ~(1U << cube)}};
+            places_[Cubes + cube] = {cube, 0, Around[cube], {0, 0, ~0U, ~0U}};
         }
     }
+    void show(const Board& board) {
+        for (std::uint32_t cube = 0; cube < Cubes; ++cube) {
+            const bool isQu = board[cube] == 'q';
+            setLetter(cube, static_cast<std::uint32_t>(board[cube] - 'a'));
+            setLetter(Cubes + cube, isQu ? 'u' - 'a' : NoLetter);
+            places_[cube].touching = isQu ? 1U << (Cubes + cube) : Around[cube];
+        }
+    }
+    const Place& operator[](std::size_t place) const { return places_[place]; }
+
+    // The letter of each place, as the bit of a byte of a set of letters.
+    alignas(32) std::array<std::uint8_t, Places> byte{};
+    alignas(32) std::array<std::uint8_t, Places> bit{};
+
+  private:
+    static constexpr std::uint32_t NoLetter = 30;  // in no edge
+
+    void setLetter(std::uint32_t place, std::uint32_t letter) {
+        places_[place].below = (1U << letter) - 1;
+        byte[place] = static_cast<std::uint8_t>(letter / 8);
+        bit[place] = static_cast<std::uint8_t>(1U << letter % 8);
+    }
+
+    std::array<Place, Places> places_;
 };
 
 }  // namespace Quorle

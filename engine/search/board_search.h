@@ -1,11 +1,9 @@
 #pragma once
 // Finding every word of a graph on a board of touching cubes.
-#include <memory>
-#include <vector>
-
 #include "graph/dictionary.h"
 #include "search/board.h"
 #include "search/found_words.h"
+#include "search/recent_chains.h"
 
 namespace Quorle {
 
@@ -15,24 +13,53 @@ enum class Matching { Plain, Avx2 };
 /// Whether this machine can do it.
 bool CanMatch(Matching matching);
 
-/// The working memory of searches, used again by each.
+/// A beginning of words on the board. The cubes still free stand in the edge's field `none`, and
+/// its words before are those of the whole dictionary: so a step is an edge and what a place keeps
+/// of the chain, added up.
+struct Chain {
+    Edge head;
+    std::uint64_t path;  // as of a FoundWord
+    std::uint32_t next;  // bit i: the chain can go on with place i
+};
+static_assert(sizeof(Chain) == 32);
+
+/// The working memory of searches, some 3 MB of which each touches what it needs.
 class BoardSearch {
   public:
     explicit BoardSearch(Matching matching);
-    ~BoardSearch();
-    BoardSearch(const BoardSearch&) = delete;
-    BoardSearch& operator=(const BoardSearch&) = delete;
 
-    /// Replaces `found` by the words found, each once, in no order. Throws std::bad_alloc; then
-    /// the BoardSearch is of no more use.
-    void search(const WordGraph& graph, const Board& board, WordLimits limits,
-                std::vector<FoundWord>& found);
+    /// Replaces `found` by the words found, not yet in order. Throws std::bad_alloc.
+    void search(const WordGraph& graph, const Board& board, WordLimits limits, FoundWords& found);
 
   private:
-    struct State;
+    static constexpr std::uint32_t Block = 512;  // chains extended together
+    static constexpr std::size_t MostGrown = std::size_t{Block} * MostTouching;
 
-    Matching matching_;
-    std::unique_ptr<State> state_;
+    /// Chains of as many letters as the level's number.
+    struct Level {
+        Chain* begin;
+        Chain* end;
+    };
+
+    void runAvx2(const Edge& root);
+    template <class Match>
+    void run(const Match& match, const Edge& root);
+    template <class Match>
+    Chain* extend(const Match& match, const Chain* chain, const Chain* end, Chain* to,
+                  std::int32_t letters);
+    Chain* thinOut(Chain* begin, Chain* end, std::int32_t letters);
+    bool allFound(const Edge& edge, std::uint32_t before, std::int32_t letters, int& edgesLeft);
+
+    const Matching matching_;
+    BoardPlaces places_;
+    const Edge* edges_ = nullptr;
+    FoundWords* found_ = nullptr;
+    WordLimits limits_;
+    RecentChains recent_;  // once a board is hard
+    std::array<Level, LongestWord + 2> levels_;
+    // The chains that wait to be extended, level behind level: a stack, of which each level takes
+    // what one block can grow to. One chain more may be written and not counted.
+    std::array<Chain, (LongestWord + 1) * MostGrown + 1> chains_;
 };
 
 }  // namespace Quorle

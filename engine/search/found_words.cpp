@@ -13,65 +13,88 @@ constexpr unsigned FewBits = 6;
 constexpr unsigned ManyBits = 9;
 constexpr std::size_t ManyWords = 300;
 
+}  // namespace
+
+void FoundWords::clear(std::size_t dictionary) {
+    for (std::size_t i = 0; i < size_; ++i) known_[words_[i].number / 64] = 0;
+    size_ = 0;
+    isFinished_ = false;
+    if (dictionary < knownSize_) return;
+    known_ = TakeZeroed<std::uint64_t>(dictionary / 64 + 1);
+    knownSize_ = dictionary + 1;
+}
+
+FoundWord* FoundWords::room(std::size_t most) {
+    if (words_.size() < size_ + most) words_.resize(2 * size_ + most);
+    return words_.data() + size_;
+}
+
+void FoundWords::take(const FoundWord* end, std::uint32_t letters) {
+    FoundWord* to = words_.data() + size_;
+    for (const FoundWord* word = to; word != end; ++word) {
+        const std::uint32_t number = word->number;
+        std::uint64_t& known = known_[number / 64];
+        *to = {word->path, number, letters};
+        to += ~known >> number % 64 & 1;
+        known |= std::uint64_t{1} << number % 64;
+    }
+    size_ = static_cast<std::size_t>(to - words_.data());
+}
+
 /// Sorts by all digits, the lowest first; how often each occurs is counted in one pass.
 template <unsigned DigitBits>
-void SortByDigits(std::vector<FoundWord>& words, std::vector<FoundWord>& room) {
+void FoundWords::sortByDigits() {
     constexpr std::uint32_t Digits = 1U << DigitBits;
     constexpr std::size_t Most = (32 + DigitBits - 1) / DigitBits;
-    std::uint32_t all = 0;
-    for (const FoundWord& word : words) all |= word.number;
-    const std::size_t used =
-        (static_cast<unsigned>(std::bit_width(all)) + DigitBits - 1) / DigitBits;
+    const auto digit = [](const FoundWord& word, std::size_t i) {
+        return word.number >> i * DigitBits & (Digits - 1);
+    };
+    const auto bits = static_cast<unsigned>(std::bit_width(knownSize_ - 1));
+    const std::size_t used = (bits + DigitBits - 1) / DigitBits;
     std::array<std::array<std::uint32_t, Digits>, Most> places;
     std::fill_n(places.begin(), used, std::array<std::uint32_t, Digits>{});
-    for (const FoundWord& word : words) {
-        for (std::size_t i = 0; i < used; ++i)
-            ++places[i][word.number >> i * DigitBits & (Digits - 1)];
+    for (std::size_t word = 0; word < size_; ++word) {
+        for (std::size_t i = 0; i < used; ++i) ++places[i][digit(words_[word], i)];
     }
+    sorted_.resize(words_.size());
     for (std::size_t i = 0; i < used; ++i) {
         std::uint32_t before = 0;
         for (std::uint32_t& place : places[i]) before += std::exchange(place, before);
-        for (const FoundWord& word : words) {
-            room[places[i][word.number >> i * DigitBits & (Digits - 1)]++] = word;
+        for (std::size_t word = 0; word < size_; ++word) {
+            sorted_[places[i][digit(words_[word], i)]++] = words_[word];
         }
-        words.swap(room);
+        words_.swap(sorted_);
     }
 }
 
-}  // namespace
-
-void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room) {
-    room.resize(words.size());
-    const bool many = words.size() >= ManyWords;
-    many ? SortByDigits<ManyBits>(words, room) : SortByDigits<FewBits>(words, room);
-}
-
-Speller::Speller(const Board& board) {
+void FoundWords::finish(const Board& board) {
+    size_ >= ManyWords ? sortByDigits<ManyBits>() : sortByDigits<FewBits>();
     std::uint16_t* pair = pairs_.data();
     for (const char first : board) {
-        hasQu_ = hasQu_ || first == 'q';
         for (const char second : board) *pair++ = static_cast<std::uint16_t>(first << 8 | second);
     }
+    hasQu_ = std::find(board.begin(), board.end(), 'q') != board.end();
+    isFinished_ = true;
 }
 
 // Words of up to eight letters, nearly all there are, are put together two cubes at a time.
-PackedWord Speller::operator()(const FoundWord& word) const {
-    const std::uint64_t path = word.path << 4 * (LongestWord - word.letters);
-    const auto pair = [&](unsigned shift) { return std::uint64_t{pairs_[path >> shift & 0xff]}; };
+std::size_t FoundWords::spell(std::size_t i, char* to) const {
+    const std::size_t letters = words_[i].letters;
+    const std::uint64_t path = words_[i].path << 4 * (LongestWord - letters);
     const auto four = [&](unsigned shift) {
-        return pair(shift + 24) << 48 | pair(shift + 16) << 32 | pair(shift + 8) << 16 |
-               pair(shift);
+        std::uint64_t spelled = 0;
+        for (unsigned pair = 0; pair < 4; ++pair) {
+            spelled = spelled << 16 | pairs_[path >> (shift + 24 - 8 * pair) & 0xff];
+        }
+        return spelled;
     };
-    PackedWord spelled = PackedWord{four(32)} << 64;
-    if (word.letters > 8) spelled |= four(0);
-    spelled = FirstLetters(spelled, word.letters);
-    if (!hasQu_) return spelled;
-    // A cube twice in a row is the Qu cube, of which the second letter is the "u".
-    for (std::size_t i = 1; i < word.letters; ++i) {
-        const std::uint64_t both = path >> 4 * (LongestWord - 1 - i) & 0xff;
-        if (both >> 4 == both % 16) spelled += PackedLetter('u' - 'q', i) - PackedLetter(0, i);
+    WriteLetters(PackedWord{four(32)} << 64 | (letters > 8 ? four(0) : 0), letters, to);
+    for (std::size_t place = 1; hasQu_ && place < letters; ++place) {
+        // A cube twice in a row is the Qu cube.
+        const std::uint64_t both = path >> 4 * (LongestWord - 1 - place) & 0xff;
+        if (both >> 4 == both % 16) to[place] = 'u';
     }
-    return spelled;
+    return letters;
 }
 
 }  // namespace Quorle

@@ -1,9 +1,10 @@
 #pragma once
-// The words that a search finds. What costs time is put off until the words are asked for: their
-// order, and their letters.
+// The words that a search finds, each once. What costs time is put off until the words are asked
+// for: their order, and their letters.
 #include <vector>
 
 #include "graph/packed_word.h"
+#include "graph/zeroed_memory.h"
 #include "search/board.h"
 
 namespace Quorle {
@@ -15,18 +16,38 @@ struct FoundWord {
     std::uint32_t letters;  // how many
 };
 
-/// Puts words in the order of their numbers. `room`: memory to use again, whatever it holds.
-void SortFound(std::vector<FoundWord>& words, std::vector<FoundWord>& room);
-
-/// Writes the words of one board as letters.
-class Speller {
+class FoundWords {
   public:
-    explicit Speller(const Board& board);
+    std::size_t size() const { return size_; }
+    bool contains(std::uint32_t number) const {
+        return (known_[number / 64] >> number % 64 & 1) != 0;
+    }
 
-    PackedWord operator()(const FoundWord& word) const;
+    /// No words. Those that come are of a dictionary of so many. Throws std::bad_alloc.
+    void clear(std::size_t dictionary = 0);
+    /// Where so many words can be written behind those there are. Throws std::bad_alloc.
+    FoundWord* room(std::size_t most);
+    /// Takes in the words written there up to `end` that are new: all of so many letters.
+    void take(const FoundWord* end, std::uint32_t letters);
+
+    /// Once all are in: puts them in alphabetical order, to be spelled by the board's letters.
+    /// Throws std::bad_alloc.
+    void finish(const Board& board);
+    bool isFinished() const { return isFinished_; }
+    /// Writes the letters of the word of index `i`, and returns how many.
+    std::size_t spell(std::size_t i, char* to) const;
 
   private:
-    // The letters of each two cubes, the first in the higher byte. Twice the same: "qu".
+    template <unsigned DigitBits>
+    void sortByDigits();
+
+    std::vector<FoundWord> words_;  // more than size_
+    std::vector<FoundWord> sorted_;
+    std::size_t size_ = 0;
+    ZeroedMemory<std::uint64_t> known_;  // a bit for each word of the dictionary
+    std::size_t knownSize_ = 0;
+    bool isFinished_ = false;
+    // The letters of each two cubes, the first in the higher byte.
     std::array<std::uint16_t, std::size_t{Cubes} * Cubes> pairs_;
     bool hasQu_ = false;
 };

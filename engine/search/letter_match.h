@@ -1,7 +1,7 @@
 #pragma once
 // Which places of a board show one of a set of letters: the one thing that a search does in another
 // way where the processor has wide registers.
-#include <bit>
+#include <array>
 
 #include "search/board.h"
 
@@ -11,31 +11,34 @@
 
 namespace Quorle {
 
+/// The four fields of an edge as one value.
+using Fields [[gnu::vector_size(16)]] = std::uint32_t;
+
 /// By tables: the places of all sets of nine letters.
 class PlainMatch {
   public:
     explicit PlainMatch(const BoardPlaces& places) {
-        std::array<std::uint32_t, 32> shown{};
         for (std::uint32_t i = 0; i < Places; ++i) {
-            shown[static_cast<std::uint32_t>(std::countr_zero(places.shown[i]))] |= 1U << i;
+            const auto letter = static_cast<std::uint32_t>(std::popcount(places[i].below));
+            tables_[letter / 9][1U << letter % 9] |= 1U << i;
         }
-        for (std::uint32_t table = 0; table < 3; ++table) {
-            for (std::uint32_t bit = 0; bit < 9; ++bit) {
-                std::uint32_t* const sets = tables_[table].data();
-                for (std::uint32_t i = 0; i < 1U << bit; ++i) {
-                    sets[(1U << bit) + i] = sets[i] | shown[9 * table + bit];
-                }
+        for (auto& table : tables_) {
+            for (std::uint32_t set = 1; set < table.size(); ++set) {
+                table[set] = table[set & (set - 1)] | table[set & -set];
             }
         }
     }
-    /// Bit i: place i shows one of the letters.
-    std::uint32_t operator()(std::uint32_t letters) const {
+    /// Bit i: place i shows one of the letters that follow.
+    std::uint32_t operator()(Fields edge) const {
+        const std::uint32_t letters = edge[0];
         return tables_[0][letters % 512] | tables_[1][letters >> 9 & 511] |
                tables_[2][letters >> 18 & 511];
     }
+    /// 1 when a word ends with the edge, else 0.
+    static std::uint32_t wordEnds(Fields edge) { return edge[0] >> 31; }
 
   private:
-    std::array<std::array<std::uint32_t, 512>, 3> tables_{};
+    std::array<std::array<std::uint32_t, 512>, 4> tables_{};  // the last one of no letter
 };
 
 #if defined(__x86_64__)
@@ -44,25 +47,23 @@ class PlainMatch {
 class Avx2Match {
   public:
     [[gnu::target("avx2")]] explicit Avx2Match(const BoardPlaces& places) {
-        alignas(32) std::array<std::uint8_t, Places> bytes{};
-        alignas(32) std::array<std::uint8_t, Places> bits{};
-        for (std::uint32_t i = 0; i < Places; ++i) {
-            const auto letter = static_cast<std::uint32_t>(std::countr_zero(places.shown[i]));
-            bytes[i] = static_cast<std::uint8_t>(letter / 8);
-            bits[i] = static_cast<std::uint8_t>(1U << letter % 8);
-        }
-        bytes_ = _mm256_load_si256(reinterpret_cast<const __m256i*>(bytes.data()));
-        bits_ = _mm256_load_si256(reinterpret_cast<const __m256i*>(bits.data()));
+        byte_ = _mm256_load_si256(reinterpret_cast<const __m256i*>(places.byte.data()));
+        bit_ = _mm256_load_si256(reinterpret_cast<const __m256i*>(places.bit.data()));
     }
-    [[gnu::target("avx2")]] std::uint32_t operator()(std::uint32_t letters) const {
-        const __m256i all = _mm256_set1_epi32(static_cast<int>(letters));
-        const __m256i own = _mm256_and_si256(_mm256_shuffle_epi8(all, bytes_), bits_);
-        return static_cast<std::uint32_t>(_mm256_movemask_epi8(_mm256_cmpeq_epi8(own, bits_)));
+    [[gnu::target("avx2")]] std::uint32_t operator()(Fields edge) const {
+        const __m256i all = _mm256_broadcastd_epi32(reinterpret_cast<__m128i>(edge));
+        const __m256i own = _mm256_and_si256(_mm256_shuffle_epi8(all, byte_), bit_);
+        return static_cast<std::uint32_t>(_mm256_movemask_epi8(_mm256_cmpeq_epi8(own, bit_)));
+    }
+
+    /// By the signs of all fields: no other one has any.
+    static std::uint32_t wordEnds(Fields edge) {
+        return static_cast<std::uint32_t>(_mm_movemask_ps(reinterpret_cast<__m128>(edge)));
     }
 
   private:
-    __m256i bytes_;
-    __m256i bits_;
+    __m256i byte_;
+    __m256i bit_;
 };
 
 #endif

@@ -43,16 +43,13 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
     Words found(const WordGraph& graph, const std::string& letters, WordLimits limits) {
         Board board{};
         std::copy(letters.begin(), letters.end(), board.begin());
-        std::vector<FoundWord> found;
-        std::vector<FoundWord> room;
+        FoundWords found;
         search_->search(graph, board, limits, found);
-        SortFound(found, room);
-        const Speller spell(board);
+        found.finish(board);
         Words words;
-        for (const FoundWord& each : found) {
+        for (std::size_t i = 0; i < found.size(); ++i) {
             std::array<char, 16> word{};
-            WriteLetters(spell(each), each.letters, word.data());
-            const std::string spelled(word.data(), each.letters);
+            const std::string spelled(word.data(), found.spell(i, word.data()));
             EXPECT_TRUE(words.empty() || *words.rbegin() < spelled) << spelled;
             words.insert(spelled);
         }
