@@ -7,6 +7,7 @@ namespace Quorle {
 namespace {
 
 constexpr std::size_t LeastEdges = 1024;
+constexpr std::size_t SlotsAtOnce = 1 << 18;
 
 std::uint64_t Hash(const OpenNode& open) {
     std::uint64_t hash = open.letters * 0x9e3779b97f4a7c15U;
@@ -20,25 +21,26 @@ std::uint64_t Hash(const OpenNode& open) {
 
 }  // namespace
 
-// Zeroed memory that the system hands out page by page as it is used: clearing a large table at
-// once would take long.
 GraphBuilder::Table::Table(std::size_t count)
-    : slots(static_cast<Slot*>(std::calloc(count, sizeof(Slot)))),
-      last(count - 1),
-      room(count - count / 4) {
-    if (!slots) throw std::bad_alloc();
-}
+    : slots(TakeZeroed<Slot>(count)), last(count - 1), room(count - count / 4) {}
 
-/// The slot of the stored node of these edges, or the free one where it belongs.
-GraphBuilder::Slot& GraphBuilder::Table::find(const OpenNode& open, std::uint64_t hash,
-                                              const Edge* edges) const {
+/// The first edge of the stored node that is like the open one; 0 when there is none.
+std::uint32_t GraphBuilder::Table::find(const OpenNode& open, std::uint64_t hash,
+                                        const Edge* edges) const {
     for (std::size_t at = hash & last;; at = (at + 1) & last) {
-        Slot& slot = slots[at];
-        if (slot.first == 0) return slot;
+        const Slot& slot = slots[at];
+        if (slot.first == 0) return 0;
         if (slot.letters != open.letters) continue;
         const Edge* const own = open.edges.data();
-        if (std::equal(own, own + open.count, edges + slot.first)) return slot;
+        if (std::equal(own, own + open.count, edges + slot.first)) return slot.first;
     }
+}
+
+void GraphBuilder::Table::insert(Slot slot, std::uint64_t hash) {
+    std::size_t at = hash & last;
+    while (slots[at].first != 0) at = (at + 1) & last;
+    slots[at] = slot;
+    --room;
 }
 
 GraphBuilder::GraphBuilder(std::size_t expectedEdges) : edges_(std::make_shared<EdgeStore>()) {
@@ -53,7 +55,7 @@ void GraphBuilder::add(PackedWord word) {
     closeNodes(SharedLetters(word, last_));
     for (; depth_ < length; ++depth_) {
         path_[depth_].open(1U << LetterAt(word, depth_));
-        path_[depth_ + 1].letters = path_[depth_ + 1].count = path_[depth_ + 1].words = 0;
+        path_[depth_ + 1].clear();
     }
     path_[depth_ - 1].endWord();
     last_ = word;
@@ -69,6 +71,18 @@ WordGraph GraphBuilder::finish(const StoredNode& root) {
     return WordGraph(std::move(edges_));
 }
 
+bool GraphBuilder::giveBack() {
+    if (tables_.empty()) return false;
+    Table& table = tables_.back();
+    if (table.last < SlotsAtOnce) {
+        tables_.pop_back();
+    } else {
+        table.last -= SlotsAtOnce;
+        Shrink(table.slots, table.last + 1);
+    }
+    return true;
+}
+
 // Stores the nodes of the last word below `depth` letters, deepest first, and leads to them.
 void GraphBuilder::closeNodes(std::size_t depth) {
     for (; depth_ > depth; --depth_) path_[depth_ - 1].lead(store(path_[depth_]));
@@ -77,21 +91,17 @@ void GraphBuilder::closeNodes(std::size_t depth) {
 StoredNode GraphBuilder::store(const OpenNode& open) {
     if (open.letters == 0) return {};
     const std::uint64_t hash = Hash(open);
-    Slot* free = nullptr;
-    for (auto table = tables_.rbegin(); table != tables_.rend(); ++table) {
-        Slot& slot = table->find(open, hash, edges_->edges());
-        if (slot.first != 0) return {open.letters, slot.first, open.words};
-        if (free == nullptr) free = &slot;
-    }
-    if (tables_.back().room-- == 0) {
-        Table& larger = tables_.emplace_back(2 * (tables_.back().last + 1));
-        --larger.room;
-        free = &larger.find(open, hash, edges_->edges());
+    // A node that leads to a new one is new itself.
+    for (auto table = tables_.rbegin(); !open.isNew && table != tables_.rend(); ++table) {
+        const std::uint32_t first = table->find(open, hash, edges_->edges());
+        if (first != 0) return {open.letters, first, open.words, false};
     }
     if (edges_->room() < open.count) edges_->reserve(edges_->size() / 2 + Letters);
-    *free = {edges_->append(open.count), open.letters};
-    std::copy_n(open.edges.data(), open.count, edges_->edges() + free->first);
-    return {open.letters, free->first, open.words};
+    const std::uint32_t first = edges_->append(open.count);
+    std::copy_n(open.edges.data(), open.count, edges_->edges() + first);
+    if (tables_.back().room == 0) tables_.emplace_back(4 * (tables_.back().last + 1));
+    tables_.back().insert({first, open.letters}, hash);
+    return {open.letters, first, open.words, true};
 }
 
 }  // namespace Quorle

@@ -1,12 +1,12 @@
 #pragma once
 // Building the minimal graph of sorted words in one pass.
 #include <array>
-#include <cstdlib>
 #include <memory>
 #include <vector>
 
 #include "graph/packed_word.h"
 #include "graph/word_graph.h"
+#include "graph/zeroed_memory.h"
 
 namespace Quorle {
 
@@ -15,6 +15,7 @@ struct StoredNode {
     std::uint32_t letters = 0;
     std::uint32_t first = 0;
     std::uint32_t words = 0;
+    bool isNew = false;
 };
 
 /// A node that is still open for more letters.
@@ -22,8 +23,13 @@ struct OpenNode {
     std::uint32_t letters = 0;
     std::uint32_t count = 0;
     std::uint32_t words = 0;
+    bool isNew = false;  // it leads to a new node
     std::array<Edge, Letters> edges;
 
+    void clear() {
+        letters = count = words = 0;
+        isNew = false;
+    }
     /// `bit`: of a letter after all that are there.
     void open(std::uint32_t bit) {
         assert(letters < bit);
@@ -40,6 +46,7 @@ struct OpenNode {
         edges[count - 1].letters |= node.letters;
         edges[count - 1].first = node.first;
         words += node.words;
+        isNew = isNew || node.isNew;
     }
 };
 
@@ -54,6 +61,9 @@ class GraphBuilder {
     void add(PackedWord word);
     /// The graph of all words added. The builder is of no more use.
     WordGraph finish();
+    /// Then gives back some of the builder's memory, for at once it would take long; false when
+    /// there is no more.
+    bool giveBack();
 
     /// Instead of words, nodes can be stored one by one, children first.
     StoredNode store(const OpenNode& open);
@@ -66,13 +76,11 @@ class GraphBuilder {
         std::uint32_t first;  // 0: free
         std::uint32_t letters;
     };
-    struct Free {
-        void operator()(Slot* slots) const { std::free(slots); }
-    };
     struct Table {
         explicit Table(std::size_t slots);
-        Slot& find(const OpenNode& open, std::uint64_t hash, const Edge* edges) const;
-        std::unique_ptr<Slot[], Free> slots;
+        std::uint32_t find(const OpenNode& open, std::uint64_t hash, const Edge* edges) const;
+        void insert(Slot slot, std::uint64_t hash);
+        ZeroedMemory<Slot> slots;
         std::size_t last;
         std::size_t room;
     };

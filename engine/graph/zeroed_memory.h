@@ -22,4 +22,13 @@ ZeroedMemory<Item> TakeZeroed(std::size_t count) {
     return memory;
 }
 
+/// Gives back what is behind `count` items.
+template <class Item>
+void Shrink(ZeroedMemory<Item>& memory, std::size_t count) {
+    void* const shrunk = std::realloc(memory.get(), count * sizeof(Item));
+    if (shrunk == nullptr) return;
+    static_cast<void>(memory.release());
+    memory.reset(static_cast<Item*>(shrunk));
+}
+
 }  // namespace Quorle

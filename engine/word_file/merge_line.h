@@ -1,15 +1,13 @@
 #pragma once
-// Merging word files into the dictionary, a step at a time.
-#include <deque>
-#include <memory>
+// Merging word files into the dictionary, one after the other, a step at a time.
+#include <optional>
+#include <queue>
 #include <string>
 
-#include "word_file/merged_dictionary.h"
-#include "word_file/word_file_reader.h"
+#include "word_file/file_merge.h"
 
 namespace Quorle {
 
-/// The files asked for since nothing was stepping.
 class MergeLine {
   public:
     explicit MergeLine(Dictionary& dictionary) : dictionary_(dictionary) {}
@@ -20,20 +18,13 @@ class MergeLine {
     std::int32_t step(const char* path);
 
   private:
-    bool beginNext();
-    void endCurrent();
     bool work();
-    void workOnce();
-    void beginAnew();
-    double fraction() const;
-    std::int32_t percent();
+    bool hasCurrent();
 
     Dictionary& dictionary_;
-    std::unique_ptr<WordFileReader> current_;
-    std::unique_ptr<MergedDictionary> build_;  // once all of the current file is read
-    std::deque<std::string> waiting_;
-    int outdated_ = 0;  // how often the current one had to begin anew
-    int done_ = 0;
+    std::optional<FileMerge> current_;
+    std::queue<std::string> waiting_;
+    int done_ = 0;  // files, since nothing was stepping
     std::int32_t percent_ = 0;
 };
 

@@ -1,8 +1,8 @@
 #pragma once
 // Sorting the words of a file in small pieces of work. Words in ascending order, as most word
 // files have them, are only kept; others are sorted a chunk at a time, and the runs of ascending
-// words that come of it are merged as they are read.
-#include <algorithm>
+// words that come of it are merged as they are taken out.
+#include <deque>
 #include <vector>
 
 #include "graph/packed_word.h"
@@ -15,47 +15,35 @@ class SortedWords {
         if (chunk_.size() == ChunkSize) endChunk();
         chunk_.push_back(word);
     }
-    /// Takes in what was added last.
-    void endChunk();
+    /// All words are in.
+    void finish();
     /// Not fewer than there are different words.
     std::size_t size() const { return size_; }
 
-  private:
-    friend class SortedWordsReader;
-    static constexpr std::size_t ChunkSize = 4096;
-
-    std::vector<std::vector<PackedWord>> chunks_;
-    std::vector<std::size_t> runs_;  // the first chunk of each
-    std::vector<PackedWord> chunk_;
-    std::size_t size_ = 0;
-};
-
-/// The words in strictly ascending order. Memory is given back as they are read: at once it would
-/// take long.
-class SortedWordsReader {
-  public:
-    SortedWordsReader() = default;
-    /// The words are finished.
-    explicit SortedWordsReader(SortedWords words);
-
-    /// The next word; false at the end.
+    /// Once they are in: the next word, strictly ascending; false at the end. Memory is given back
+    /// as words are taken out, for at once it would take long.
     bool next(PackedWord& word);
 
   private:
-    /// The next word of a run, and where it goes on.
+    static constexpr std::size_t ChunkSize = 4096;
+
+    using Chunks = std::deque<std::vector<PackedWord>>;
+    /// A run by its next word.
     struct Head {
         PackedWord word;
         const PackedWord* at;
         const PackedWord* chunkEnd;
-        std::size_t chunk;
-        std::size_t end;
+        Chunks* chunks;
     };
 
+    static bool advance(Head& head);
+    void endChunk();
     void sink(std::size_t place);
-    bool advance(Head& head);
 
-    SortedWords words_;
+    std::vector<PackedWord> chunk_;
+    std::deque<Chunks> runs_;
     std::vector<Head> heads_;  // a heap, the smallest word first
+    std::size_t size_ = 0;
     PackedWord last_ = 0;
 };
 
