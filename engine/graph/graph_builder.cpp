@@ -85,23 +85,26 @@ bool GraphBuilder::giveBack() {
 
 // Stores the nodes of the last word below `depth` letters, deepest first, and leads to them.
 void GraphBuilder::closeNodes(std::size_t depth) {
-    for (; depth_ > depth; --depth_) path_[depth_ - 1].lead(store(path_[depth_]));
+    for (; depth_ > depth; --depth_) {
+        const std::size_t size = edges_->size();
+        path_[depth_ - 1].lead(store(path_[depth_]));
+        if (edges_->size() > size) path_[depth_ - 1].isNew = true;
+    }
 }
 
 StoredNode GraphBuilder::store(const OpenNode& open) {
     if (open.letters == 0) return {};
     const std::uint64_t hash = Hash(open);
-    // A node that leads to a new one is new itself.
     for (auto table = tables_.rbegin(); !open.isNew && table != tables_.rend(); ++table) {
         const std::uint32_t first = table->find(open, hash, edges_->edges());
-        if (first != 0) return {open.letters, first, open.words, false};
+        if (first != 0) return {open.letters, first, open.words};
     }
     if (edges_->room() < open.count) edges_->reserve(edges_->size() / 2 + Letters);
     const std::uint32_t first = edges_->append(open.count);
     std::copy_n(open.edges.data(), open.count, edges_->edges() + first);
     if (tables_.back().room == 0) tables_.emplace_back(4 * (tables_.back().last + 1));
     tables_.back().insert({first, open.letters}, hash);
-    return {open.letters, first, open.words, true};
+    return {open.letters, first, open.words};
 }
 
 }  // namespace Quorle

@@ -15,7 +15,6 @@ struct StoredNode {
     std::uint32_t letters = 0;
     std::uint32_t first = 0;
     std::uint32_t words = 0;
-    bool isNew = false;
 };
 
 /// A node that is still open for more letters.
@@ -23,7 +22,7 @@ struct OpenNode {
     std::uint32_t letters = 0;
     std::uint32_t count = 0;
     std::uint32_t words = 0;
-    bool isNew = false;  // it leads to a new node
+    bool isNew = false;  // as is known of what leads to a new node
     std::array<Edge, Letters> edges;
 
     void clear() {
@@ -46,7 +45,6 @@ struct OpenNode {
         edges[count - 1].letters |= node.letters;
         edges[count - 1].first = node.first;
         words += node.words;
-        isNew = isNew || node.isNew;
     }
 };
 

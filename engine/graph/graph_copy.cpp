@@ -13,7 +13,10 @@ namespace {
 class Copier {
   public:
     explicit Copier(const WordGraph& words)
-        : edges_(words.edges()), builder_(words.edgesEnd()), heights_(words.edgesEnd()) {}
+        : edges_(words.edges()),
+          builder_(words.edgesEnd()),
+          heights_(words.edgesEnd()),
+          whole_(words.edgesEnd()) {}
 
     WordGraph copy(const Edge& root, std::size_t longest) {
         return builder_.finish(copyNode(root, longest));
@@ -24,11 +27,14 @@ class Copier {
     // becomes several nodes; where nothing is cut off, the place makes no difference.
     StoredNode copyNode(const Edge& to, std::size_t letters) {
         if (letters == 0 || to.next() == 0) return {};
-        letters = std::min(letters, height(to));
-        const auto [place, isNew] = copies_.try_emplace(std::uint64_t{to.first} << 8 | letters);
-        StoredNode& copied = place->second;
-        if (isNew) copied = copyEdges(to, letters);
-        return copied;
+        if (letters >= height(to)) {
+            StoredNode& whole = whole_[to.first];
+            if (whole.letters == 0) whole = copyEdges(to, letters);
+            return whole;
+        }
+        const auto [cut, isNew] = cut_.try_emplace(std::uint64_t{to.first} << 8 | letters);
+        if (isNew) cut->second = copyEdges(to, letters);
+        return cut->second;
     }
 
     StoredNode copyEdges(const Edge& to, std::size_t letters) {
@@ -57,8 +63,10 @@ class Copier {
 
     const Edge* edges_;
     GraphBuilder builder_;
-    std::vector<std::uint8_t> heights_;                     // of nodes, by their first edge
-    std::unordered_map<std::uint64_t, StoredNode> copies_;  // by first edge and letters
+    // Of nodes, by their first edge.
+    std::vector<std::uint8_t> heights_;
+    std::vector<StoredNode> whole_;
+    std::unordered_map<std::uint64_t, StoredNode> cut_;  // and by the letters left
 };
 
 }  // namespace
