@@ -76,14 +76,112 @@ class Decoder {
         : header_(header), code_(code), end_(end) {}
 
     /// The finished base, or null.
-    std::shared_ptr<EdgeStore> read();
+    std::shared_ptr<EdgeStore> read() {
+        auto store = std::make_shared<EdgeStore>();
+        store->reserve(header_.edges);
+        store->append(header_.edges);
+        edges_ = store->edges();
+        nodes_.resize(MostWaiting + 1 + std::size_t{header_.shared});
+        if (!readTables() || !readAllNodes() || !isFinished()) return nullptr;
+        store->closeBase({nodes_[0].letters, nodes_[0].first});
+        return store;
+    }
 
   private:
-    bool readTables();
-    bool readAllNodes();
-    const std::byte* readNodes(const std::byte* code, const std::byte* end);
-    bool readNode(const std::byte*& code);
-    bool isFinished() const;
+    bool readTables() {
+        masks_.resize(FirstMaskCode);
+        for (int left = header_.masks; left > 0; --left, code_ += 4) {
+            masks_.push_back(FourBytes(code_));
+            if (!IsMask(masks_.back())) return false;
+        }
+        const std::uint32_t numbers = FirstSharedCode + header_.hotLinks;
+        for (std::uint32_t first = 0; first < 256; ++first) {
+            links_[first] = {FirstShared + StartOf(first) - numbers, 0};
+        }
+        links_[EndCode] = {1, 0};
+        links_[NewChildCode] = {0, 1};
+        links_[NewWordCode] = {1, 1};
+        for (std::uint32_t code = FirstSharedCode; code < numbers; ++code, code_ += 4) {
+            links_[code] = {FirstShared + FourBytes(code_), 0};
+            if (FourBytes(code_) >> 1 >= header_.shared) return false;
+        }
+        return true;
+    }
+
+    // The end is asked for between nodes only: the last ones are read from a copy with room behind
+    // it.
+    bool readAllNodes() {
+        const std::byte* const code = CountingBits(
+            [&] { return readNodes(code_, end_ - std::min(end_ - code_, MostNodeBytes)); });
+        if (code == nullptr) return false;
+        std::array<std::byte, 2 * MostNodeBytes> rest{};
+        const std::byte* const restEnd = std::copy(code, end_, rest.data());
+        return readNodes(rest.data(), restEnd) == restEnd;
+    }
+
+    /// Reads nodes as long as they begin before `end`, and returns where the last one ends; null
+    /// when they are wrong.
+    const std::byte* readNodes(const std::byte* code, const std::byte* end) {
+        while (code < end) {
+            if (*code != std::byte{ShareCode}) {
+                if (!readNode(code)) return nullptr;
+                continue;
+            }
+            if (waiting_ == 0 || shared_ == header_.shared) return nullptr;
+            nodes_[MostWaiting + ++shared_] = nodes_[waiting_ - 1];
+            ++code;
+        }
+        return code;
+    }
+
+    bool readNode(const std::byte*& code) {
+        const std::uint32_t mask = readMask(code);
+        const auto count = static_cast<std::uint32_t>(std::popcount(mask));
+        if (!IsMask(mask) || count > header_.edges + 1 - edge_) return false;
+        const Node* const nodes = nodes_.data();
+        Edge* edge = edges_ + edge_;
+        std::uint32_t waiting = waiting_;
+        std::uint64_t words = 0;
+        std::uint32_t height = 0;
+        for (std::uint32_t left = mask; left != 0; left &= left - 1, ++edge) {
+            const Code link = TakeCode(code);
+            if (link.first == LongCode && link.rest < TwoByteCodes) return false;
+            const std::uint32_t isNew = links_[link.first].isNew;
+            const std::uint32_t place = links_[link.first].place + link.rest;
+            if (isNew > waiting || place >> 1 > shared_) return false;
+            const std::uint32_t toNew = (0 - isNew) & (MostWaiting + 1 - waiting);
+            const Node& child = nodes[MostWaiting + (place >> 1) - toNew];
+            waiting -= isNew;
+            words += place & 1;
+            *edge = {child.letters | place << 31, child.first, static_cast<std::uint32_t>(words)};
+            words += child.words;
+            height = std::max(height, child.height + 1);
+        }
+        if (words > INT32_MAX || height > LongestWord || waiting == MostWaiting) return false;
+        nodes_[waiting] = {mask, edge_, static_cast<std::uint32_t>(words), height};
+        edge_ += count;
+        ++nodeCount_;
+        waiting_ = waiting + 1;
+        return true;
+    }
+
+    std::uint32_t readMask(const std::byte*& code) const {
+        const Code mask = TakeCode(code);
+        if (mask.first == LongCode) return mask.rest;
+        const std::uint32_t number = StartOf(mask.first) + mask.rest;
+        return number < masks_.size() ? masks_[number] : 0;
+    }
+
+    // Exactly one node has no parent, all counts are used up, and no word has one letter only.
+    bool isFinished() const {
+        const Node& root = nodes_[0];
+        const Edge* const edges = edges_ + root.first;
+        return edge_ == header_.edges + 1 && nodeCount_ == header_.nodes &&
+               shared_ == header_.shared && waiting_ == std::min(nodeCount_, 1U) &&
+               root.words == header_.words &&
+               std::none_of(edges, edges + std::popcount(root.letters),
+                            [](const Edge& edge) { return edge.isWord(); });
+    }
 
     const DictionaryHeader header_;
     const std::byte* code_;
@@ -98,106 +196,6 @@ class Decoder {
     // Those that wait in MostWaiting places, then nothing, then the shared nodes by number.
     std::vector<Node> nodes_;
 };
-
-std::shared_ptr<EdgeStore> Decoder::read() {
-    auto store = std::make_shared<EdgeStore>();
-    store->reserve(header_.edges);
-    store->append(header_.edges);
-    edges_ = store->edges();
-    nodes_.resize(MostWaiting + 1 + std::size_t{header_.shared});
-    if (!readTables() || !readAllNodes() || !isFinished()) return nullptr;
-    store->closeBase({nodes_[0].letters, nodes_[0].first});
-    return store;
-}
-
-bool Decoder::readTables() {
-    masks_.resize(FirstMaskCode);
-    for (int left = header_.masks; left > 0; --left, code_ += 4) {
-        masks_.push_back(FourBytes(code_));
-        if (!IsMask(masks_.back())) return false;
-    }
-    const std::uint32_t numbers = FirstSharedCode + header_.hotLinks;
-    for (std::uint32_t first = 0; first < 256; ++first) {
-        links_[first] = {FirstShared + StartOf(first) - numbers, 0};
-    }
-    links_[EndCode] = {1, 0};
-    links_[NewChildCode] = {0, 1};
-    links_[NewWordCode] = {1, 1};
-    for (std::uint32_t code = FirstSharedCode; code < numbers; ++code, code_ += 4) {
-        links_[code] = {FirstShared + FourBytes(code_), 0};
-        if (FourBytes(code_) >> 1 >= header_.shared) return false;
-    }
-    return true;
-}
-
-// The end is asked for between nodes only: the last ones are read from a copy with room behind it.
-bool Decoder::readAllNodes() {
-    const std::byte* const code = CountingBits(
-        [&] { return readNodes(code_, end_ - std::min(end_ - code_, MostNodeBytes)); });
-    if (code == nullptr) return false;
-    std::array<std::byte, 2 * MostNodeBytes> rest{};
-    const std::byte* const restEnd = std::copy(code, end_, rest.data());
-    return readNodes(rest.data(), restEnd) == restEnd;
-}
-
-/// Reads nodes as long as they begin before `end`, and returns where the last one ends; null when
-/// they are wrong.
-inline const std::byte* Decoder::readNodes(const std::byte* code, const std::byte* end) {
-    while (code < end) {
-        if (*code != std::byte{ShareCode}) {
-            if (!readNode(code)) return nullptr;
-            continue;
-        }
-        if (waiting_ == 0 || shared_ == header_.shared) return nullptr;
-        nodes_[MostWaiting + ++shared_] = nodes_[waiting_ - 1];
-        ++code;
-    }
-    return code;
-}
-
-inline bool Decoder::readNode(const std::byte*& code) {
-    const Code known = TakeCode(code);
-    const std::uint32_t number = StartOf(known.first) + known.rest;
-    std::uint32_t mask = known.rest;
-    if (known.first != LongCode) mask = number < masks_.size() ? masks_[number] : 0;
-    const auto count = static_cast<std::uint32_t>(std::popcount(mask));
-    if (!IsMask(mask) || count > header_.edges + 1 - edge_) return false;
-    const Node* const nodes = nodes_.data();
-    Edge* edge = edges_ + edge_;
-    std::uint32_t waiting = waiting_;
-    std::uint64_t words = 0;
-    std::uint32_t height = 0;
-    for (std::uint32_t left = mask; left != 0; left &= left - 1, ++edge) {
-        const Code link = TakeCode(code);
-        if (link.first == LongCode && link.rest < TwoByteCodes) return false;
-        const std::uint32_t isNew = links_[link.first].isNew;
-        const std::uint32_t place = links_[link.first].place + link.rest;
-        if (isNew > waiting || place >> 1 > shared_) return false;
-        const std::uint32_t toNew = (0 - isNew) & (MostWaiting + 1 - waiting);
-        const Node& child = nodes[MostWaiting + (place >> 1) - toNew];
-        waiting -= isNew;
-        words += place & 1;
-        *edge = {child.letters | place << 31, child.first, static_cast<std::uint32_t>(words)};
-        words += child.words;
-        height = std::max(height, child.height + 1);
-    }
-    if (words > INT32_MAX || height > LongestWord || waiting == MostWaiting) return false;
-    nodes_[waiting] = {mask, edge_, static_cast<std::uint32_t>(words), height};
-    edge_ += count;
-    ++nodeCount_;
-    waiting_ = waiting + 1;
-    return true;
-}
-
-// Exactly one node has no parent, all counts are used up, and no word has one letter only.
-bool Decoder::isFinished() const {
-    const Node& root = nodes_[0];
-    const Edge* const edges = edges_ + root.first;
-    return edge_ == header_.edges + 1 && nodeCount_ == header_.nodes && shared_ == header_.shared &&
-           waiting_ == std::min(nodeCount_, 1U) && root.words == header_.words &&
-           std::none_of(edges, edges + std::popcount(root.letters),
-                        [](const Edge& edge) { return edge.isWord(); });
-}
 
 /// Of the counts, whether the bytes can hold so many, before any memory is asked for.
 bool IsSound(const DictionaryHeader& header, std::span<const std::byte> file) {
