@@ -1,5 +1,6 @@
 #pragma once
 // An open file or folder, closed on every way out.
+#include <fcntl.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -37,6 +38,12 @@ auto RepeatInterrupted(Call call) {
     auto result = call();
     while (result == -1 && errno == EINTR) result = call();
     return result;
+}
+
+/// Empty, and errno, when it cannot be opened.
+inline FileDescriptor OpenAt(int folder, const char* path, int flags, mode_t mode = 0) {
+    return FileDescriptor(
+        RepeatInterrupted([&] { return openat(folder, path, flags | O_CLOEXEC, mode); }));
 }
 
 }  // namespace Quorle
