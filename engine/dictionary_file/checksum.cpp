@@ -11,9 +11,7 @@ constexpr auto Table = [] {
     std::array<std::uint32_t, 256> table{};
     for (std::uint32_t i = 0; i < 256; ++i) {
         table[i] = i;
-        for (int bit = 0; bit < 8; ++bit) {
-            table[i] = table[i] >> 1 ^ (table[i] % 2 == 1 ? 0x82f63b78U : 0);
-        }
+        for (int bit = 0; bit < 8; ++bit) table[i] = table[i] >> 1 ^ table[i] % 2 * 0x82f63b78U;
     }
     return table;
 }();

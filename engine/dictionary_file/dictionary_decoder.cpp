@@ -3,7 +3,6 @@
 
 #include "dictionary_file/dictionary_file.h"
 #include "dictionary_file/file_form.h"
-#include "graph/bit_count.h"
 
 // Links lead to nodes read before, so there are no cycles; words and heights add up as the nodes
 // come, so no walk of the finished graph is needed to know that it is sound.
@@ -72,8 +71,8 @@ constexpr std::uint32_t FirstShared = 2;  // as a place
 
 class Decoder {
   public:
-    Decoder(const DictionaryHeader& header, const std::byte* code, const std::byte* end)
-        : header_(header), code_(code), end_(end) {}
+    Decoder(const DictionaryHeader& header, std::span<const std::byte> file)
+        : header_(header), code_(file.data() + HeaderSize), end_(file.data() + file.size()) {}
 
     /// The finished base, or null.
     std::shared_ptr<EdgeStore> read() {
@@ -111,8 +110,8 @@ class Decoder {
     // The end is asked for between nodes only: the last ones are read from a copy with room behind
     // it.
     bool readAllNodes() {
-        const std::byte* const code = CountingBits(
-            [&] { return readNodes(code_, end_ - std::min(end_ - code_, MostNodeBytes)); });
+        const std::byte* const code =
+            readNodes(code_, end_ - std::min(end_ - code_, MostNodeBytes));
         if (code == nullptr) return false;
         std::array<std::byte, 2 * MostNodeBytes> rest{};
         const std::byte* const restEnd = std::copy(code, end_, rest.data());
@@ -123,27 +122,28 @@ class Decoder {
     /// when they are wrong.
     const std::byte* readNodes(const std::byte* code, const std::byte* end) {
         while (code < end) {
-            if (*code != std::byte{ShareCode}) {
-                if (!readNode(code)) return nullptr;
-                continue;
+            if (*code == std::byte{ShareCode}) {
+                if (waiting_ == 0 || shared_ == header_.shared) return nullptr;
+                nodes_[MostWaiting + ++shared_] = nodes_[waiting_ - 1];
+                ++code;
+            } else if (!readNode(code)) {
+                return nullptr;
             }
-            if (waiting_ == 0 || shared_ == header_.shared) return nullptr;
-            nodes_[MostWaiting + ++shared_] = nodes_[waiting_ - 1];
-            ++code;
         }
         return code;
     }
 
     bool readNode(const std::byte*& code) {
         const std::uint32_t mask = readMask(code);
-        const auto count = static_cast<std::uint32_t>(std::popcount(mask));
-        if (!IsMask(mask) || count > header_.edges + 1 - edge_) return false;
+        if (!IsMask(mask)) return false;
         const Node* const nodes = nodes_.data();
+        const Edge* const end = edges_ + header_.edges + 1;
         Edge* edge = edges_ + edge_;
         std::uint32_t waiting = waiting_;
         std::uint64_t words = 0;
         std::uint32_t height = 0;
         for (std::uint32_t left = mask; left != 0; left &= left - 1, ++edge) {
+            if (edge == end) return false;
             const Code link = TakeCode(code);
             if (link.first == LongCode && link.rest < TwoByteCodes) return false;
             const std::uint32_t isNew = links_[link.first].isNew;
@@ -159,7 +159,7 @@ class Decoder {
         }
         if (words > INT32_MAX || height > LongestWord || waiting == MostWaiting) return false;
         nodes_[waiting] = {mask, edge_, static_cast<std::uint32_t>(words), height};
-        edge_ += count;
+        edge_ = static_cast<std::uint32_t>(edge - edges_);
         ++nodeCount_;
         waiting_ = waiting + 1;
         return true;
@@ -175,12 +175,10 @@ class Decoder {
     // Exactly one node has no parent, all counts are used up, and no word has one letter only.
     bool isFinished() const {
         const Node& root = nodes_[0];
-        const Edge* const edges = edges_ + root.first;
+        const std::span edges(edges_ + root.first, std::popcount(root.letters));
         return edge_ == header_.edges + 1 && nodeCount_ == header_.nodes &&
                shared_ == header_.shared && waiting_ == std::min(nodeCount_, 1U) &&
-               root.words == header_.words &&
-               std::none_of(edges, edges + std::popcount(root.letters),
-                            [](const Edge& edge) { return edge.isWord(); });
+               root.words == header_.words && std::ranges::none_of(edges, &Edge::isWord);
     }
 
     const DictionaryHeader header_;
@@ -214,11 +212,9 @@ bool DecodeDictionary(std::span<const std::byte> file, DictionaryContent& conten
     DictionaryHeader header;
     if (file.size() < HeaderSize) return false;
     std::memcpy(&header, file.data(), HeaderSize);
-    if (!IsSound(header, file)) return false;
-    auto store = Decoder(header, file.data() + HeaderSize, file.data() + file.size()).read();
+    auto store = IsSound(header, file) ? Decoder(header, file).read() : nullptr;
     if (!store) return false;
-    content.words = WordGraph(std::move(store));
-    content.maxWordSize = header.maxWordSize;
+    content = {WordGraph(std::move(store)), header.maxWordSize};
     return true;
 }
 

@@ -17,16 +17,16 @@ void Put(Bytes& out, std::uint32_t value, int bytes) {
     for (; bytes > 0; --bytes, value >>= 8) out.push_back(static_cast<std::byte>(value));
 }
 
-void PutLong(Bytes& out, std::uint32_t value) {
-    Put(out, LongCode, 1);
-    Put(out, value, 4);
-}
-
-void PutCode(Bytes& out, std::uint32_t code) {
-    if (code < OneByteCodes) return Put(out, code, 1);
-    if (code >= TwoByteCodes) return PutLong(out, code);
-    Put(out, OneByteCodes + ((code - OneByteCodes) >> 8), 1);
-    Put(out, code - OneByteCodes, 1);
+void PutCode(Bytes& out, std::uint32_t code, bool isLong) {
+    if (isLong) {
+        Put(out, LongCode, 1);
+        Put(out, code, 4);
+    } else if (code < OneByteCodes) {
+        Put(out, code, 1);
+    } else {
+        Put(out, OneByteCodes + ((code - OneByteCodes) >> 8), 1);
+        Put(out, code - OneByteCodes, 1);
+    }
 }
 
 /// Writes at most `most` of the values that occur as a table, the most frequent first; the uses
@@ -105,17 +105,15 @@ class Encoder {
         auto code = codes_.begin();
         for (const Edge& to : order_) {
             const auto mask = masks_.find(to.next());
-            if (mask != masks_.end()) {
-                PutCode(out, mask->second);
-            } else {
-                PutLong(out, to.next());
-            }
+            const bool isHot = mask != masks_.end();
+            PutCode(out, isHot ? mask->second : to.next(), !isHot);
             for (std::uint32_t i = 0; i < to.count(); ++i, ++code) {
                 const auto hot = hotLinks_.find(*code - FirstSharedCode);
                 const std::uint32_t cold = *code + (*code < FirstSharedCode ? 0 : header_.hotLinks);
-                PutCode(out, hot == hotLinks_.end() ? cold : hot->second);
+                const std::uint32_t link = hot != hotLinks_.end() ? hot->second : cold;
+                PutCode(out, link, link >= TwoByteCodes);
             }
-            if (nodes_[to.first].uses > 1) PutCode(out, ShareCode);
+            if (nodes_[to.first].uses > 1) Put(out, ShareCode, 1);
         }
     }
 

@@ -4,12 +4,13 @@
 
 namespace Quorle {
 
-namespace {
-
 // Nothing of ours comes near; a larger file must not exhaust the memory before it is refused.
 constexpr std::size_t MaxFileSize = std::size_t{1} << 30;
 
-}  // namespace
+FileDescriptor OpenAt(int folder, const char* path, int flags, mode_t mode) {
+    return FileDescriptor(
+        RepeatInterrupted([&] { return openat(folder, path, flags | O_CLOEXEC, mode); }));
+}
 
 FileDescriptor OpenRegularFile(int folder, const char* path, std::size_t& size) {
     FileDescriptor file = OpenAt(folder, path, O_RDONLY | O_NONBLOCK | O_NOCTTY);

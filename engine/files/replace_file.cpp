@@ -16,7 +16,8 @@ namespace {
 // save removes it. Not made from the target's name, which may be as long as names can be.
 constexpr const char* TemporaryName = ".quorle-save";
 constexpr int MaxLinks = 40;
-constexpr std::chrono::seconds LockPatience{1};
+constexpr int LockTries = 500;
+constexpr std::chrono::milliseconds LockPause{2};
 
 bool KnowsNoLocks(int error) {
     // EBADF: network file systems lock only what is open for writing, as no folder can be.
@@ -25,14 +26,12 @@ bool KnowsNoLocks(int error) {
 }
 
 bool Lock(int folder) {
-    const auto deadline = std::chrono::steady_clock::now() + LockPatience;
-    while (flock(folder, LOCK_EX | LOCK_NB) != 0) {
-        if (errno == EINTR) continue;
-        if (errno != EWOULDBLOCK) return KnowsNoLocks(errno);
-        if (std::chrono::steady_clock::now() > deadline) return false;
-        std::this_thread::sleep_for(std::chrono::milliseconds(2));
+    for (int tries = 0; tries < LockTries; ++tries) {
+        if (flock(folder, LOCK_EX | LOCK_NB) == 0) return true;
+        if (errno != EWOULDBLOCK && errno != EINTR) return KnowsNoLocks(errno);
+        std::this_thread::sleep_for(LockPause);
     }
-    return true;
+    return false;
 }
 
 /// Writes all of `content`, whatever is cut short; false when the system would not.
@@ -56,32 +55,26 @@ bool IsSame(const struct stat& one, const struct stat& other) {
     return one.st_dev == other.st_dev && one.st_ino == other.st_ino;
 }
 
-/// A save under way: what it has put into the folder goes again, unless it takes the target's
+/// A save under way. What it has put into the folder goes again, unless it takes the target's
 /// place.
 class Replacement {
   public:
-    Replacement(int folder, const std::string& name, mode_t mode) : folder_(folder), name_(name) {
-        unlinkat(folder, TemporaryName, 0);  // what a killed save has left
-        file_ = OpenAt(folder, TemporaryName, O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW, mode);
-        isThere_ = static_cast<bool>(file_);
-    }
+    Replacement(int folder, const std::string& name, FileDescriptor temporary)
+        : folder_(folder), name_(name), file_(std::move(temporary)) {}
     ~Replacement() {
+        if (isDone_) return;
+        unlinkat(folder_, TemporaryName, 0);
         // Two names of one file both stay when one is to become the other.
-        if (!second_.empty() && move(second_.c_str(), name_.c_str())) {
-            unlinkat(folder_, second_.c_str(), 0);
-        }
-        if (isThere_) unlinkat(folder_, TemporaryName, 0);
+        if (second_.empty() || !move(second_, name_)) return;
+        unlinkat(folder_, second_.c_str(), 0);
     }
-    explicit operator bool() const { return isThere_; }
 
     /// Gives the file the old one's owner, group and mode; false when the mode cannot be kept.
     bool takeOver(const struct stat& old) {
         const int file = file_.number();
         // Only the administrator may give a file away; its group may be within the player's reach.
-        const auto sameOwner = static_cast<uid_t>(-1);
-        if (fchown(file, old.st_uid, old.st_gid) != 0) {
-            [[maybe_unused]] const int grouped = fchown(file, sameOwner, old.st_gid);
-        }
+        [[maybe_unused]] const bool isOwned = fchown(file, old.st_uid, old.st_gid) == 0 ||
+                                              fchown(file, static_cast<uid_t>(-1), old.st_gid) == 0;
         struct stat now;
         if (fstat(file, &now) != 0) return false;
         const mode_t mode = old.st_mode & mode_t{07777};
@@ -105,11 +98,8 @@ class Replacement {
             second = name_ + ".damaged." + std::to_string(number++);
         }
         if (errno != ENOENT) return false;
-        const char* const first = name_.c_str();
-        if (linkat(folder_, first, folder_, second.c_str(), 0) != 0 &&
-            (errno == EEXIST || !move(first, second.c_str()))) {
-            return false;
-        }
+        const bool isLinked = linkat(folder_, name_.c_str(), folder_, second.c_str(), 0) == 0;
+        if (!isLinked && (errno == EEXIST || !move(name_, second))) return false;
         second_ = std::move(second);
         return true;
     }
@@ -117,24 +107,22 @@ class Replacement {
     bool takePlace() {
         // Where the file system knows no locks another save may have taken the name meanwhile.
         struct stat named;
-        if (fstatat(folder_, TemporaryName, &named, AT_SYMLINK_NOFOLLOW) != 0) return false;
-        if (!IsSame(named, own_) || !move(TemporaryName, name_.c_str())) return false;
-        second_.clear();
-        isThere_ = false;
-        return true;
+        isDone_ = fstatat(folder_, TemporaryName, &named, AT_SYMLINK_NOFOLLOW) == 0 &&
+                  IsSame(named, own_) && move(TemporaryName, name_);
+        return isDone_;
     }
 
   private:
-    bool move(const char* from, const char* to) const {
-        return renameat(folder_, from, folder_, to) == 0;
+    bool move(const std::string& from, const std::string& to) const {
+        return renameat(folder_, from.c_str(), folder_, to.c_str()) == 0;
     }
 
     int folder_;
     const std::string& name_;
     FileDescriptor file_;
-    bool isThere_ = false;
     struct stat own_ = {};
     std::string second_;  // of the old file, if it is new
+    bool isDone_ = false;
 };
 
 }  // namespace
@@ -161,8 +149,12 @@ bool ReplaceFile(const FileTarget& target, std::span<const std::byte> content, O
     const bool exists = fstatat(folder, name, &standing, AT_SYMLINK_NOFOLLOW) == 0;
     if (exists ? !S_ISREG(standing.st_mode) : errno != ENOENT) return false;
 
-    Replacement replacement(folder, target.name, exists ? 0600 : 0666);
-    if (!replacement || (exists && !replacement.takeOver(standing))) return false;
+    unlinkat(folder, TemporaryName, 0);  // what a killed save has left
+    FileDescriptor temporary = OpenAt(
+        folder, TemporaryName, O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW, exists ? 0600 : 0666);
+    if (!temporary) return false;
+    Replacement replacement(folder, target.name, std::move(temporary));
+    if (exists && !replacement.takeOver(standing)) return false;
     if (!replacement.complete(content)) return false;
     if (exists && old == Old::Stays && !replacement.giveSecondName(standing)) return false;
     // Some file systems sync no folders and say so.

@@ -5,7 +5,7 @@
 #include <span>
 #include <string>
 
-#include "files/file_descriptor.h"
+#include "files/read_file.h"
 
 namespace Quorle {
 

@@ -8,7 +8,6 @@
 #include <optional>
 #include <vector>
 
-#include "files/read_file.h"
 #include "files/replace_file.h"
 
 namespace Quorle {
@@ -21,9 +20,8 @@ namespace {
 constexpr std::size_t MaxTextSize = 255;
 
 bool IsText(std::string_view text) {
-    return text.size() <= MaxTextSize && std::ranges::none_of(text, [](char c) {
-               return static_cast<unsigned char>(c) < 0x20 || c == 0x7f;
-           });
+    const auto isControl = [](unsigned char c) { return c < 0x20 || c == 0x7f; };
+    return text.size() <= MaxTextSize && std::ranges::none_of(text, isControl);
 }
 
 /// What the lines of a setting begin with; empty when it cannot be one.
@@ -65,13 +63,6 @@ std::filesystem::path SettingsPath() {
     return std::filesystem::path(home) / ".config/quorle/settings";
 }
 
-/// Makes what is missing of the path, for the player alone. What cannot be made shows when the
-/// file is opened.
-void MakeFolders(const std::filesystem::path& folder) {
-    std::filesystem::path made;
-    for (const auto& name : folder) mkdir((made /= name).c_str(), 0700);
-}
-
 }  // namespace
 
 bool GetSetting(std::string_view key, std::string_view name, std::string& value) {
@@ -81,7 +72,7 @@ bool GetSetting(std::string_view key, std::string_view name, std::string& value)
     if (path.empty() || start.empty()) return false;
     if (ReadFileAt(AT_FDCWD, path.c_str(), content) != ReadResult::Done) return false;
     const Parts parts = TakeApart(content, start);
-    value = parts.value.value_or(value);
+    if (parts.value) value = *parts.value;
     return parts.value.has_value();
 }
 
@@ -89,7 +80,9 @@ bool SetSetting(std::string_view key, std::string_view name, std::string_view va
     const std::filesystem::path path = SettingsPath();
     const std::string start = LineStart(key, name);
     if (path.empty() || start.empty() || !IsText(value)) return false;
-    MakeFolders(path.parent_path());
+    // Folders are for the player alone. What cannot be made shows when the file is opened.
+    std::filesystem::path made;
+    for (const auto& part : path.parent_path()) mkdir((made /= part).c_str(), 0700);
     const FileTarget target = LockTarget(path.c_str());
     if (!target.folder) return false;
     std::vector<std::byte> content;

@@ -3,7 +3,7 @@
 #include <utility>
 #include <vector>
 
-#include "files/file_descriptor.h"
+#include "files/read_file.h"
 #include "word_file/sorted_words.h"
 
 namespace Quorle {
