@@ -110,11 +110,10 @@ class Decoder {
     // The end is asked for between nodes only: the last ones are read from a copy with room behind
     // it.
     bool readAllNodes() {
-        const std::byte* const code =
-            readNodes(code_, end_ - std::min(end_ - code_, MostNodeBytes));
-        if (code == nullptr) return false;
+        code_ = readNodes(code_, end_ - std::min(end_ - code_, MostNodeBytes));
+        if (code_ == nullptr) return false;
         std::array<std::byte, 2 * MostNodeBytes> rest{};
-        const std::byte* const restEnd = std::copy(code, end_, rest.data());
+        const std::byte* const restEnd = std::copy(code_, end_, rest.data());
         return readNodes(rest.data(), restEnd) == restEnd;
     }
 

@@ -13,20 +13,15 @@ namespace {
 using Bytes = std::vector<std::byte>;
 using Codes = std::unordered_map<std::uint32_t, std::uint32_t>;
 
-void Put(Bytes& out, std::uint32_t value, int bytes) {
+void Put(Bytes& out, std::uint64_t value, int bytes) {
     for (; bytes > 0; --bytes, value >>= 8) out.push_back(static_cast<std::byte>(value));
 }
 
 void PutCode(Bytes& out, std::uint32_t code, bool isLong) {
-    if (isLong) {
-        Put(out, LongCode, 1);
-        Put(out, code, 4);
-    } else if (code < OneByteCodes) {
-        Put(out, code, 1);
-    } else {
-        Put(out, OneByteCodes + ((code - OneByteCodes) >> 8), 1);
-        Put(out, code - OneByteCodes, 1);
-    }
+    if (isLong) return Put(out, LongCode | std::uint64_t{code} << 8, 5);
+    if (code < OneByteCodes) return Put(out, code, 1);
+    Put(out, OneByteCodes + (code - OneByteCodes) / 256, 1);
+    Put(out, code - OneByteCodes, 1);
 }
 
 /// Writes at most `most` of the values that occur as a table, the most frequent first; the uses
