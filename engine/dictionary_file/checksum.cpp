@@ -17,7 +17,9 @@ constexpr auto Table = [] {
 }();
 
 std::uint32_t ByTable(std::uint32_t crc, std::span<const std::byte> bytes) {
-    for (const std::byte byte : bytes) crc = crc >> 8 ^ Table[crc % 256 ^ static_cast<int>(byte)];
+    for (const std::byte byte : bytes) {
+        crc = crc >> 8 ^ Table[crc % 256 ^ std::to_integer<std::uint32_t>(byte)];
+    }
     return crc;
 }
 

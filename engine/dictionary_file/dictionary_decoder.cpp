@@ -173,11 +173,11 @@ class Decoder {
 
     // Exactly one node has no parent, all counts are used up, and no word has one letter only.
     bool isFinished() const {
-        const Node& root = nodes_[0];
-        const std::span edges(edges_ + root.first, std::popcount(root.letters));
+        const Edge root{nodes_[0].letters, nodes_[0].first};
+        const std::span edges(edges_ + root.first, root.count());
         return edge_ == header_.edges + 1 && nodeCount_ == header_.nodes &&
                shared_ == header_.shared && waiting_ == std::min(nodeCount_, 1U) &&
-               root.words == header_.words && std::ranges::none_of(edges, &Edge::isWord);
+               nodes_[0].words == header_.words && std::ranges::none_of(edges, &Edge::isWord);
     }
 
     const DictionaryHeader header_;
@@ -194,7 +194,8 @@ class Decoder {
     std::vector<Node> nodes_;
 };
 
-/// Of the counts, whether the bytes can hold so many, before any memory is asked for.
+/// Whether it is a header of ours, the checksum right, and the counts no more than the bytes can
+/// hold: memory is asked for by them.
 bool IsSound(const DictionaryHeader& header, std::span<const std::byte> file) {
     const std::size_t tables = 4 * (std::size_t{header.masks} + header.hotLinks);
     const std::size_t codes = std::size_t{header.nodes} + header.edges + header.shared;
