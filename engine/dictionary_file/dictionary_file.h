@@ -21,6 +21,6 @@ std::vector<std::byte> EncodeDictionary(const DictionaryContent& content);
 /// Takes a file's bytes apart; false, and `content` as it was, when they are not exactly what
 /// EncodeDictionary may write. Takes time and memory of a small multiple of the bytes, whatever
 /// they are. Throws std::bad_alloc.
-bool DecodeDictionary(std::span<const std::byte> bytes, DictionaryContent& content);
+bool DecodeDictionary(std::span<const std::byte> file, DictionaryContent& content);
 
 }  // namespace Quorle

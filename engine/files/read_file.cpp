@@ -1,20 +1,19 @@
 #include "files/read_file.h"
 
-#include <fcntl.h>
 #include <sys/stat.h>
 
 namespace Quorle {
 
-namespace {
-
 // Nothing of ours comes near; a larger file must not exhaust the memory before it is refused.
 constexpr std::size_t MaxFileSize = std::size_t{1} << 30;
 
-}  // namespace
+FileDescriptor OpenAt(int folder, const char* path, int flags, mode_t mode) {
+    return FileDescriptor(
+        RepeatInterrupted([&] { return openat(folder, path, flags | O_CLOEXEC, mode); }));
+}
 
 FileDescriptor OpenRegularFile(int folder, const char* path, std::size_t& size) {
-    FileDescriptor file(RepeatInterrupted(
-        [&] { return openat(folder, path, O_RDONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC); }));
+    FileDescriptor file = OpenAt(folder, path, O_RDONLY | O_NONBLOCK | O_NOCTTY);
     struct stat status;
     if (!file || fstat(file.number(), &status) != 0) return {};
     size = static_cast<std::size_t>(status.st_size);
@@ -26,8 +25,7 @@ FileDescriptor OpenRegularFile(int folder, const char* path, std::size_t& size) 
 bool ReadOn(int file, std::byte* to, std::size_t size, std::size_t& got) {
     for (got = 0; got < size;) {
         const ssize_t more = RepeatInterrupted([&] { return read(file, to + got, size - got); });
-        if (more < 0) return false;
-        if (more == 0) return true;
+        if (more <= 0) return more == 0;
         got += static_cast<std::size_t>(more);
     }
     return true;

@@ -1,14 +1,13 @@
 #include "settings/settings_file.h"
 
-#include <fcntl.h>
 #include <sys/stat.h>
 
 #include <algorithm>
 #include <cstdlib>
-#include <span>
+#include <filesystem>
+#include <optional>
 #include <vector>
 
-#include "files/read_file.h"
 #include "files/replace_file.h"
 
 namespace Quorle {
@@ -21,103 +20,77 @@ namespace {
 constexpr std::size_t MaxTextSize = 255;
 
 bool IsText(std::string_view text) {
-    return text.size() <= MaxTextSize && std::ranges::none_of(text, [](char c) {
-               return static_cast<unsigned char>(c) < 0x20 || c == 0x7f;
-           });
+    const auto isControl = [](unsigned char c) { return c < 0x20 || c == 0x7f; };
+    return text.size() <= MaxTextSize && std::ranges::none_of(text, isControl);
 }
 
-bool IsName(std::string_view text) {
-    return !text.empty() && IsText(text);
-}
-
+/// What the lines of a setting begin with; empty when it cannot be one.
 std::string LineStart(std::string_view key, std::string_view name) {
+    if (key.empty() || name.empty() || !IsText(key) || !IsText(name)) return {};
     return std::string(key).append("\t").append(name).append("\t");
 }
 
-/// Takes the next line, its end left out, from the front of `text`.
-std::string_view NextLine(std::string_view& text) {
-    const std::string_view line = text.substr(0, text.find('\n'));
-    text.remove_prefix(std::min(line.size() + 1, text.size()));
-    return line;
-}
+/// The settings file taken apart where a setting stands, or would.
+struct Parts {
+    std::string before;
+    std::optional<std::string> value;
+    std::string after;
+};
 
-bool IsSetting(std::string_view line, std::string_view start) {
-    return line.starts_with(start) && IsText(line.substr(start.size()));
-}
-
-std::string WithSetting(std::string_view text, std::string_view start, std::string_view value) {
-    std::string changed;
-    bool written = false;
-    const auto write = [&] {
-        if (!written) changed.append(start).append(value).append("\n");
-        written = true;
-    };
+Parts TakeApart(const std::vector<std::byte>& content, std::string_view start) {
+    Parts parts;
+    std::string_view text(reinterpret_cast<const char*>(content.data()), content.size());
     while (!text.empty()) {
-        const std::string_view line = NextLine(text);
-        if (IsSetting(line, start)) {
-            write();
-        } else {
-            changed.append(line).append("\n");
+        const std::string_view line = text.substr(0, text.find('\n'));
+        text.remove_prefix(std::min(line.size() + 1, text.size()));
+        if (!line.starts_with(start) || !IsText(line.substr(start.size()))) {
+            (parts.value ? parts.after : parts.before).append(line).append("\n");
+        } else if (!parts.value) {
+            parts.value = line.substr(start.size());
         }
     }
-    write();
-    return changed;
+    return parts;
 }
 
-/// The settings' folder without a slash at its end; empty when the player has no home.
-std::string SettingsFolder() {
+/// Empty when the player has no home.
+std::filesystem::path SettingsPath() {
     const char* configuration = std::getenv("XDG_CONFIG_HOME");
     if (configuration != nullptr && *configuration == '/') {
-        return std::string(configuration) + "/quorle";
+        return std::filesystem::path(configuration) / "quorle/settings";
     }
     const char* home = std::getenv("HOME");
     if (home == nullptr || *home == '\0') return {};
-    return std::string(home) + "/.config/quorle";
-}
-
-/// Makes what is missing of the folder's path. What cannot be made shows when the file is opened.
-void MakeFolders(const std::string& folder) {
-    for (std::size_t end = folder.find('/', 1); end != std::string::npos;
-         end = folder.find('/', end + 1)) {
-        mkdir(folder.substr(0, end).c_str(), 0700);
-    }
-    mkdir(folder.c_str(), 0700);
-}
-
-std::string_view AsText(const std::vector<std::byte>& content) {
-    return {reinterpret_cast<const char*>(content.data()), content.size()};
+    return std::filesystem::path(home) / ".config/quorle/settings";
 }
 
 }  // namespace
 
 bool GetSetting(std::string_view key, std::string_view name, std::string& value) {
-    const std::string folder = SettingsFolder();
-    std::vector<std::byte> content;
-    if (folder.empty() || !IsName(key) || !IsName(name)) return false;
-    const std::string path = folder + "/settings";
-    if (ReadFileAt(AT_FDCWD, path.c_str(), content) != ReadResult::Done) return false;
+    const std::filesystem::path path = SettingsPath();
     const std::string start = LineStart(key, name);
-    std::string_view text = AsText(content);
-    while (!text.empty()) {
-        const std::string_view line = NextLine(text);
-        if (!IsSetting(line, start)) continue;
-        value = line.substr(start.size());
-        return true;
-    }
-    return false;
+    std::vector<std::byte> content;
+    if (path.empty() || start.empty()) return false;
+    if (ReadFileAt(AT_FDCWD, path.c_str(), content) != ReadResult::Done) return false;
+    const Parts parts = TakeApart(content, start);
+    if (parts.value) value = *parts.value;
+    return parts.value.has_value();
 }
 
 bool SetSetting(std::string_view key, std::string_view name, std::string_view value) {
-    const std::string folder = SettingsFolder();
-    if (folder.empty() || !IsName(key) || !IsName(name) || !IsText(value)) return false;
-    MakeFolders(folder);
-    const FileTarget target = FindTarget((folder + "/settings").c_str());
-    if (!target.folder || !LockFolder(target)) return false;
+    const std::filesystem::path path = SettingsPath();
+    const std::string start = LineStart(key, name);
+    if (path.empty() || start.empty() || !IsText(value)) return false;
+    // Folders are for the player alone. What cannot be made shows when the file is opened.
+    std::filesystem::path made;
+    for (const auto& part : path.parent_path()) mkdir((made /= part).c_str(), 0700);
+    const FileTarget target = LockTarget(path.c_str());
+    if (!target.folder) return false;
     std::vector<std::byte> content;
-    const int where = target.folder.number();
-    if (ReadFileAt(where, target.name.c_str(), content) == ReadResult::Failed) return false;
-    const std::string changed = WithSetting(AsText(content), LineStart(key, name), value);
-    return ReplaceFile(target, std::as_bytes(std::span(changed)));
+    const int folder = target.folder.number();
+    if (ReadFileAt(folder, target.name.c_str(), content) == ReadResult::Failed) return false;
+    Parts parts = TakeApart(content, start);
+    parts.before.append(start).append(value).append("\n").append(parts.after);
+    return ReplaceFile(target, std::as_bytes(std::span(parts.before)));
 }
 
 }  // namespace Quorle

@@ -1,10 +1,7 @@
 #include "word_file/file_merge.h"
 
-#include <fcntl.h>
-
 #include <algorithm>
 
-#include "files/read_file.h"
 #include "word_file/word_text.h"
 
 namespace Quorle {

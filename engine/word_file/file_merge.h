@@ -4,7 +4,7 @@
 #include <memory>
 #include <vector>
 
-#include "files/file_descriptor.h"
+#include "files/read_file.h"
 #include "graph/dictionary.h"
 #include "graph/graph_builder.h"
 #include "graph/word_cursor.h"

@@ -4,8 +4,7 @@
 
 #include <cstring>
 
-#include "dictionary_file/crc32c.h"
-#include "dictionary_file/graph_codec.h"
+#include "dictionary_file/file_form.h"
 #include "graph/graph_copy.h"
 #include "random_words.h"
 
@@ -57,8 +56,6 @@ TEST(DictionaryFile, KeepsItsForm) {
 std::vector<std::byte> Forged(std::uint32_t words, std::uint32_t nodes, std::uint32_t edges,
                               std::uint32_t shared, const std::string& content) {
     DictionaryHeader header{};
-    header.magic = 0x64727551;
-    header.version = 1;
     header.maxWordSize = 16;
     header.words = words;
     header.nodes = nodes;
@@ -67,8 +64,7 @@ std::vector<std::byte> Forged(std::uint32_t words, std::uint32_t nodes, std::uin
     std::vector<std::byte> file(HeaderSize + content.size());
     std::memcpy(file.data() + HeaderSize, content.data(), content.size());
     std::memcpy(file.data(), &header, HeaderSize);
-    const std::span<const std::byte> all(file);
-    header.checksum = Crc32c(Crc32c(0, all.first(4)), all.subspan(8));
+    header.checksum = Checksum(file);
     std::memcpy(file.data(), &header, HeaderSize);
     return file;
 }

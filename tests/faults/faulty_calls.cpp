@@ -74,8 +74,8 @@ ssize_t write(int file, const void* data, size_t size) {
 ssize_t read(int file, void* data, size_t size) {
     return Transfer("read", SYS_read, file, data, size);
 }
-ssize_t readlinkat(int folder, const char* path, char* link, size_t size) {
-    return Perform("readlinkat", SYS_readlinkat, folder, path, link, size);
+ssize_t readlink(const char* path, char* link, size_t size) {
+    return Perform("readlink", SYS_readlink, path, link, size);
 }
 int linkat(int from, const char* path, int to, const char* name, int flags) {
     const bool possible = !Armed || !Now.noLinks;

@@ -1,14 +1,27 @@
 #pragma once
-// The nodes of a graph in the compact form of dictionary files; FILE_FORMAT.md describes it.
+// The numbers of a dictionary file that both its ways share; FILE_FORMAT.md tells what they mean.
+#include <bit>
 #include <cstddef>
 #include <cstdint>
-#include <memory>
 #include <span>
-#include <vector>
-
-#include "graph/word_graph.h"
 
 namespace Quorle {
+
+struct DictionaryHeader {
+    std::uint32_t magic = 0x64727551;  // "Qurd"
+    std::uint32_t checksum = 0;
+    std::uint16_t version = 1;
+    std::uint16_t maxWordSize = 0;
+    std::uint32_t words = 0;
+    std::uint32_t nodes = 0;
+    std::uint32_t edges = 0;
+    std::uint32_t shared = 0;
+    std::uint16_t masks = 0;
+    std::uint16_t hotLinks = 0;
+};
+inline constexpr std::size_t HeaderSize = 32;
+static_assert(sizeof(DictionaryHeader) == HeaderSize);
+static_assert(std::endian::native == std::endian::little, "numbers are copied as they are");
 
 // What stands where a node may begin.
 inline constexpr std::uint32_t ShareCode = 0;      // the node before gets a number
@@ -28,28 +41,7 @@ inline constexpr std::uint32_t TwoByteCodes = OneByteCodes + (LongCode - OneByte
 inline constexpr std::uint32_t MostMasks = TwoByteCodes - FirstMaskCode;
 inline constexpr std::uint32_t MostHotLinks = OneByteCodes - FirstSharedCode;
 
-struct DictionaryHeader {
-    std::uint32_t magic;
-    std::uint32_t checksum;
-    std::uint16_t version;
-    std::uint16_t maxWordSize;
-    std::uint32_t words;
-    std::uint32_t nodes;
-    std::uint32_t edges;
-    std::uint32_t shared;
-    std::uint16_t masks;
-    std::uint16_t hotLinks;
-};
-inline constexpr std::uint32_t HeaderSize = 32;
-static_assert(sizeof(DictionaryHeader) == HeaderSize);
-inline constexpr std::uint32_t ChecksumAt = 4;
-
-/// Appends tables and nodes of a minimal graph to `out`, and fills in the header's counts.
-void EncodeGraph(const WordGraph& graph, std::vector<std::byte>& out, DictionaryHeader& header);
-
-/// The finished base, or null when the bytes, which follow the header and may be anything, are not
-/// exactly a graph of its counts. Throws std::bad_alloc.
-std::shared_ptr<EdgeStore> DecodeGraph(const DictionaryHeader& header,
-                                       std::span<const std::byte> bytes);
+/// The CRC-32C (Castagnoli, as in RFC 3720) of a file's bytes but the checksum's own.
+std::uint32_t Checksum(std::span<const std::byte> file);
 
 }  // namespace Quorle
