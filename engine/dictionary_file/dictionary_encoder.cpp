@@ -4,7 +4,7 @@
 
 #include "dictionary_file/dictionary_file.h"
 #include "dictionary_file/file_form.h"
-#include "graph/graph_copy.h"
+#include "graph/graph_builder.h"
 
 namespace Quorle {
 

@@ -24,16 +24,10 @@ void Dictionary::replace(WordGraph words) noexcept {
     }
 }
 
-bool Dictionary::add(std::string_view word) {
-    const bool added = words_.add(word);
-    if (added) renew(word.substr(0, 2));
-    return added;
-}
-
-bool Dictionary::remove(std::string_view word) {
-    const bool removed = words_.remove(word);
-    if (removed) renew(word.substr(0, 2));
-    return removed;
+bool Dictionary::set(std::string_view word, bool isHeld) {
+    const bool changed = words_.set(word, isHeld);
+    if (changed) renew(word.substr(0, 2));
+    return changed;
 }
 
 // An edit changes where the edges on its path lead, and no others'.

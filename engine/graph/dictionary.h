@@ -19,8 +19,7 @@ class Dictionary {
     const WordGraph& words() const { return words_; }
     void replace(WordGraph words) noexcept;
     /// As of WordGraph; words of 2 letters and more.
-    bool add(std::string_view word);
-    bool remove(std::string_view word);
+    bool set(std::string_view word, bool isHeld);
 
     /// Follows a text, which may hold anything: what an edge says of the letters that words go on
     /// with, and WordEnds; 0 when no word begins so.

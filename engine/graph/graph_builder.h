@@ -1,5 +1,5 @@
 #pragma once
-// Building the minimal graph of sorted words in one pass.
+// Building minimal graphs: of sorted words in one pass, or of another graph.
 #include <array>
 #include <memory>
 #include <vector>
@@ -92,5 +92,10 @@ class GraphBuilder {
     // When a table is full a larger one is begun, and both are looked at: moving one takes long.
     std::vector<Table> tables_;
 };
+
+/// The graph made anew of the words of at most `longest` letters (1 to 16): minimal again after
+/// edits. Goes by nodes, not by words: a small graph may spell a huge number of them. Throws
+/// std::bad_alloc.
+WordGraph CopyGraph(const WordGraph& words, std::size_t longest);
 
 }  // namespace Quorle

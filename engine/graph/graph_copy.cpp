@@ -1,8 +1,5 @@
-#include "graph/graph_copy.h"
-
 #include <algorithm>
 #include <unordered_map>
-#include <vector>
 
 #include "graph/graph_builder.h"
 

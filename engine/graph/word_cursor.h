@@ -1,5 +1,7 @@
 #pragma once
 // Reading the words of a graph in alphabetical order.
+#include <utility>
+
 #include "graph/packed_word.h"
 #include "graph/word_graph.h"
 
@@ -9,8 +11,20 @@ namespace Quorle {
 class WordCursor {
   public:
     WordCursor() = default;
-    /// `prefix`: letters "a" to "z", or empty for the whole graph.
-    explicit WordCursor(WordGraph graph, std::string_view prefix = {});
+    /// `prefix`: letters "a" to "z", or empty for the whole graph. It may be a word itself: the
+    /// last of its letters is the first one to go along.
+    explicit WordCursor(WordGraph graph, std::string_view prefix = {}) : graph_(std::move(graph)) {
+        assert(prefix.size() <= LongestWord);
+        steps_[0] = {graph_.root().first, graph_.root().letters, 0};
+        if (prefix.empty()) return;
+        depth_ = top_ = prefix.size() - 1;
+        const Edge place = graph_.find(prefix.substr(0, top_));
+        const std::uint32_t bit = LetterBit(prefix.back());
+        steps_[top_] = {place.at(bit), place.letters & bit, 0};
+        for (std::size_t i = 0; i < top_; ++i) {
+            steps_[top_].word |= PackedLetter(prefix[i] - 'a', i);
+        }
+    }
 
     /// The next word; false at the end, and from then on.
     bool next(PackedWord& word) {

@@ -1,12 +1,125 @@
 #include "graph/word_graph.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "graph/bit_count.h"
-#include "graph/graph_edit.h"
 #include "graph/packed_word.h"
 
+// An edit walks the base graph beside the current one. A node that has become like the base node
+// of the same letters is given up for that one, so edits that take each other back leave nothing
+// behind, and what an edited graph needs is what it differs by.
+
 namespace Quorle {
+
+namespace {
+
+// The most edges that one edit appends: each node on the path, with one edge more.
+constexpr std::size_t MostEditedEdges = LongestWord * (2 + std::size_t{Letters});
+
+constexpr Edge Nowhere;
+
+/// An edge of the edited word's path, and the base edge of the same letters.
+struct Step {
+    Edge* edge;
+    const Edge* base;
+};
+
+class Edit {
+  public:
+    explicit Edit(EdgeStore& store) : store_(store), edges_(store.edges()) {}
+
+    void toggle(Edge& root, std::string_view word, std::uint32_t change);
+
+  private:
+    void own(Edge& to, std::uint32_t bit);
+    void leaveOut(Edge& from, std::uint32_t bit);
+    bool joinBase(Edge& edge, const Edge& base);
+
+    EdgeStore& store_;
+    Edge* const edges_;
+};
+
+// Down the path nodes are copied, and the words behind it counted anew, by one more or less; up
+// again the edges are left out that lead nowhere, and nodes that the base has as well.
+void Edit::toggle(Edge& root, std::string_view word, std::uint32_t change) {
+    std::array<Step, LongestWord + 1> path;
+    Step* step = path.data();
+    *step = {&root, edges_};
+    for (const char letter : word) {
+        const std::uint32_t bit = LetterBit(letter);
+        own(*step->edge, bit);
+        Edge* const edge = edges_ + step->edge->at(bit);
+        Edge* const end = edges_ + step->edge->first + step->edge->count();
+        for (Edge* later = edge + 1; later < end; ++later) later->before += change;
+        const Edge& base = *step->base;
+        *++step = {edge, (base.letters & bit) != 0 ? edges_ + base.at(bit) : &Nowhere};
+    }
+    step->edge->letters ^= WordEnds;
+    step->edge->before += change;
+    for (bool goOn = true; goOn && step != path.data();) {
+        const Edge* const edge = step->edge;
+        --step;
+        goOn = edge->letters == 0;
+        if (goOn)
+            leaveOut(*step->edge, LetterBit(word[static_cast<std::size_t>(step - path.data())]));
+        if (joinBase(*step->edge, *step->base)) goOn = true;
+    }
+}
+
+// Leads the edge to a node that nothing else leads to, with an edge for the letter.
+void Edit::own(Edge& to, std::uint32_t bit) {
+    const bool hasEdge = (to.letters & bit) != 0;
+    const bool isEdited = store_.isEdited(to.first);
+    const bool isShared = !isEdited || store_.references(to.first) > 1;
+    if (hasEdge && !isShared) return;
+    const std::uint32_t count = to.count();
+    const std::uint32_t place = to.at(bit) - to.first;
+    const Edge* const from = edges_ + to.first;
+    const std::uint32_t first = store_.allocate(hasEdge ? count : count + 1);
+    Edge* copy = std::copy_n(from, place, edges_ + first);
+    if (!hasEdge) {
+        const std::uint32_t before = place == count
+                                         ? CountWords(edges_, to)
+                                         : from[place].before - (from[place].isWord() ? 1 : 0);
+        *copy++ = {0, 0, before};
+    }
+    std::copy_n(from + place, count - place, copy);
+    if (isEdited && isShared) {
+        std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
+        store_.release(to);
+    } else if (isEdited) {
+        store_.free(to.first, count);
+    }
+    to.first = first;
+    to.letters |= bit;
+}
+
+// Takes the letter's edge, which leads nowhere, out of the owned node.
+void Edit::leaveOut(Edge& from, std::uint32_t bit) {
+    const std::uint32_t count = from.count();
+    const std::uint32_t place = from.at(bit) - from.first;
+    const std::uint32_t old = from.first;
+    from.letters ^= bit;
+    from.first = count == 1 ? 0 : store_.allocate(count - 1);
+    if (count > 1) {
+        Edge* const to = std::copy_n(edges_ + old, place, edges_ + from.first);
+        std::copy_n(edges_ + old + place + 1, count - place - 1, to);
+    }
+    store_.free(old, count);
+}
+
+bool Edit::joinBase(Edge& edge, const Edge& base) {
+    if (edge.next() != base.next()) return false;
+    const std::uint32_t count = edge.count();
+    const Edge* const own = edges_ + edge.first;
+    if (!std::equal(own, own + count, edges_ + base.first)) return false;
+    if (count > 0) store_.free(edge.first, count);
+    edge.first = base.first;
+    return true;
+}
+
+}  // namespace
 
 WordGraph::WordGraph(std::shared_ptr<EdgeStore> store)
     : store_(std::move(store)),
@@ -47,27 +160,16 @@ Edge WordGraph::find(std::string_view letters) const {
     });
 }
 
-bool WordGraph::add(std::string_view word) {
-    assert(!word.empty() && word.size() <= LongestWord);
-    if (find(word).isWord()) return false;
-    prepareEdit();
-    AddWord(*store_, root_, word);
-    ++size_;
-    return true;
-}
-
-bool WordGraph::remove(std::string_view word) {
-    if (!find(word).isWord()) return false;
-    prepareEdit();
-    RemoveWord(*store_, root_, word);
-    --size_;
-    return true;
-}
-
 // All memory that an edit can need is asked for before it begins, so that it cannot fail halfway.
-void WordGraph::prepareEdit() {
+bool WordGraph::set(std::string_view word, bool isHeld) {
+    assert(!word.empty() && word.size() <= LongestWord);
+    if (find(word).isWord() == isHeld) return false;
     if (!store_) store_ = std::make_shared<EdgeStore>();
     store_->reserve(MostEditedEdges);
+    const std::uint32_t change = isHeld ? 1 : ~0U;
+    CountingBits([&] { Edit(*store_).toggle(root_, word, change); });
+    size_ += change;
+    return true;
 }
 
 }  // namespace Quorle

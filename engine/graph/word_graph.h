@@ -25,10 +25,9 @@ class WordGraph {
     /// Without letters and no word when no word begins so.
     Edge find(std::string_view letters) const;
 
-    /// Adds a word; false when it is held already. Throws std::bad_alloc and changes nothing.
-    bool add(std::string_view word);
-    /// Removes a word; false when it is not held. Throws std::bad_alloc and changes nothing.
-    bool remove(std::string_view word);
+    /// Adds a word, or removes it; false when it is held, or not, already. Copies only the nodes
+    /// on its path. Throws std::bad_alloc and changes nothing.
+    bool set(std::string_view word, bool isHeld);
 
     /// Whether no smaller graph spells the same words: true until an edit.
     bool isMinimal() const { return !store_ || root_ == store_->edges()[0]; }
@@ -42,8 +41,6 @@ class WordGraph {
     std::size_t edgesEnd() const { return store_ ? store_->size() : 1; }
 
   private:
-    void prepareEdit();
-
     std::shared_ptr<EdgeStore> store_;
     Edge root_;
     std::uint32_t size_ = 0;

@@ -1,22 +1,32 @@
 #include "quorle/word_engine.h"
 
-#include <fcntl.h>
-
 #include <algorithm>
 #include <filesystem>
+#include <set>
 
 #include "dictionary_file/dictionary_file.h"
-#include "files/read_file.h"
 #include "files/replace_file.h"
-#include "graph/graph_copy.h"
-#include "interface/engine_state.h"
+#include "graph/graph_builder.h"
+#include "search/board_search.h"
 #include "settings/settings_file.h"
+#include "word_file/merge_line.h"
 
 // The flat interface: checks what callers pass, and lets no exception out.
 
 using namespace Quorle;
 
 namespace {
+
+/// All that the engine holds between two calls.
+struct EngineState {
+    Dictionary dictionary;
+    WordCursor listing;
+    std::unique_ptr<BoardSearch> search;  // made by the first one
+    Board board{};                        // of the last one
+    FoundWords found;
+    MergeLine merges{dictionary};
+    std::set<std::string> unreadable;  // dictionary files, by their path without links
+};
 
 EngineState State;
 
@@ -45,12 +55,17 @@ bool IsWordSize(std::int32_t size) {
     return size >= 2 && size <= std::int32_t{LongestWord};
 }
 
-bool IsWord(std::string_view text) {
-    return IsWordSize(static_cast<std::int32_t>(text.size())) && IsLetters(text);
+/// A word of 2 to 16 letters; empty when it is none.
+std::string_view Word(const char* text) {
+    const std::string_view word = text == nullptr ? "" : Beginning(text);
+    const bool isWord = IsWordSize(static_cast<std::int32_t>(word.size())) && IsLetters(word);
+    return isWord ? word : "";
 }
 
-bool IsPrefix(std::int32_t first, std::int32_t second) {
-    return first >= 0 && first < Letters && second >= 0 && second < Letters;
+/// Two letters by their numbers; empty when there are no such letters.
+std::string Prefix(std::int32_t first, std::int32_t second) {
+    if (first < 0 || first >= Letters || second < 0 || second >= Letters) return {};
+    return {static_cast<char>('a' + first), static_cast<char>('a' + second)};
 }
 
 std::string PathWithoutLinks(const char* path) {
@@ -94,14 +109,13 @@ std::string WordsAsText(const WordGraph& words) {
     return text;
 }
 
-Matching BestMatching() {
-    return CanMatch(Matching::Avx2) ? Matching::Avx2 : Matching::Plain;
-}
-
 /// Finds the words on a board that is 16 letters.
 void SearchBoard(std::string_view letters) {
     std::copy(letters.begin(), letters.end(), State.board.begin());
-    if (!State.search) State.search = std::make_unique<BoardSearch>(BestMatching());
+    if (!State.search) {
+        const bool isWide = CanMatch(Matching::Avx2);
+        State.search = std::make_unique<BoardSearch>(isWide ? Matching::Avx2 : Matching::Plain);
+    }
     const Dictionary& dictionary = State.dictionary;
     State.search->search(dictionary.words(), State.board, dictionary.limits, State.found);
 }
@@ -131,21 +145,20 @@ int32_t cDictionaryCheck(char* word, int32_t* found, int32_t* other) {
     return *found;
 }
 
-int32_t cDictionaryAdd(const char* word) {
+int32_t cDictionaryAdd(const char* text) {
     return Guarded(0, [&] {
-        if (word == nullptr) return 0;
-        const std::string_view letters = Beginning(word);
+        const std::string_view word = Word(text);
         const auto longest = static_cast<std::size_t>(State.dictionary.limits.longest);
-        if (!IsWord(letters) || letters.size() > longest) return 0;
-        State.dictionary.add(letters);
+        if (word.empty() || word.size() > longest) return 0;
+        State.dictionary.set(word, true);
         return 1;
     });
 }
 
-int32_t cDictionaryRemove(const char* word) {
+int32_t cDictionaryRemove(const char* text) {
     return Guarded(0, [&] {
-        if (word == nullptr || !IsWord(Beginning(word))) return 0;
-        return State.dictionary.remove(Beginning(word)) ? 1 : 0;
+        const std::string_view word = Word(text);
+        return !word.empty() && State.dictionary.set(word, false) ? 1 : 0;
     });
 }
 
@@ -159,17 +172,16 @@ int32_t cNumberOfWords(void) {
 }
 
 int32_t cDictIndex(int32_t first, int32_t second) {
-    if (!IsPrefix(first, second)) return -1;
-    const char prefix[] = {static_cast<char>('a' + first), static_cast<char>('a' + second)};
-    const Edge place = State.dictionary.words().find({prefix, 2});
-    if (place.letters == 0) return -1;
+    const std::string prefix = Prefix(first, second);
+    const Edge place = State.dictionary.words().find(prefix);
+    if (prefix.empty() || place.letters == 0) return -1;
     return static_cast<int32_t>(place.before) - (place.isWord() ? 1 : 0);
 }
 
 int32_t cStartDecodingWords(int32_t first, int32_t second) {
-    if (!IsPrefix(first, second)) return 0;
-    const char prefix[] = {static_cast<char>('a' + first), static_cast<char>('a' + second)};
-    State.listing = WordCursor(State.dictionary.words(), {prefix, 2});
+    const std::string prefix = Prefix(first, second);
+    if (prefix.empty()) return 0;
+    State.listing = WordCursor(State.dictionary.words(), prefix);
     return 1;
 }
 
@@ -219,20 +231,19 @@ int32_t cGetDefinedWord(int32_t i, char* buffer, int32_t* n) {
 int32_t cMinWordSize(void) {
     return State.dictionary.limits.shortest;
 }
+
 int32_t cMaxWordSize(void) {
     return State.dictionary.limits.longest;
 }
 
 int32_t cSetMinWordSize(int32_t size) {
-    if (!IsWordSize(size)) return 0;
-    State.dictionary.limits.shortest = size;
-    return 1;
+    if (IsWordSize(size)) State.dictionary.limits.shortest = size;
+    return IsWordSize(size) ? 1 : 0;
 }
 
 int32_t cSetMaxWordSize(int32_t size) {
-    if (!IsWordSize(size)) return 0;
-    State.dictionary.limits.longest = size;
-    return 1;
+    if (IsWordSize(size)) State.dictionary.limits.longest = size;
+    return IsWordSize(size) ? 1 : 0;
 }
 
 int32_t cReduceWordSize(void) {
