@@ -95,6 +95,7 @@ CALL(fchmod, SYS_fchmod, (int file, mode_t mode), file, mode)
 CALL(fchown, SYS_fchown, (int file, uid_t owner, gid_t group), file, owner, group)
 CALL(flock, SYS_flock, (int file, int operation), file, operation)
 CALL(fstat, SYS_fstat, (int file, struct stat* status), file, status)
+CALL(lstat, SYS_lstat, (const char* path, struct stat* status), path, status)
 CALL(fstatat, SYS_newfstatat, (int folder, const char* path, struct stat* status, int flags),
      folder, path, status, flags)
 CALL(unlinkat, SYS_unlinkat, (int folder, const char* path, int flags), folder, path, flags)
