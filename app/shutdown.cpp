@@ -50,7 +50,9 @@ void ExitProgram() {
     Windows::Shared<Main>().close();
 }
 
-void DestroyWindows() {
+}  // namespace Common
+
+void App::DestroyWindows() {
     delete Windows::Existing<Results>;
     delete Windows::Existing<Progress>;
     delete Windows::Existing<DictionaryEditor>;
@@ -58,5 +60,3 @@ void DestroyWindows() {
     delete Windows::Existing<HelpBrowser>;
     delete Windows::Existing<Main>;
 }
-
-}  // namespace Common

@@ -5,6 +5,8 @@
 #include "entry/check_cubes.h"
 #include "state/game_state.h"
 
+namespace Entry {
+
 std::string LowerCase(std::string_view text) {
     std::string lower(text);
     std::transform(lower.begin(), lower.end(), lower.begin(), [](char c) {
@@ -41,3 +43,5 @@ TypedCut CutToBoard(std::string_view text) {
     }
     return {kept, CharacterCount(text.substr(kept)), true};
 }
+
+}  // namespace Entry

@@ -4,6 +4,8 @@
 #include <string>
 #include <string_view>
 
+namespace Entry {
+
 /// A text in lower case; only ASCII letters change, and only they are words.
 std::string LowerCase(std::string_view text);
 
@@ -20,3 +22,5 @@ struct TypedCut {
 /// the clicks have built stays untraced; anything else is cut back until it lies
 /// on the board.
 TypedCut CutToBoard(std::string_view text);
+
+}  // namespace Entry

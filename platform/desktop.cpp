@@ -12,13 +12,13 @@
 namespace Platform {
 
 void UseDesktop() {
-    ShowMessage = MessageBox::Show;
-    AskYesNo = MessageBox::Ask;
-    ChooseFileToOpen = FileDialog::ChooseToOpen;
-    ChooseFileToSave = FileDialog::ChooseToSave;
-    WarningSound = WarningSound::Play;
-    Tell = ScreenReader::Tell;
-    WindowInFront = WindowFront::Number;
+    ShowMessage = ShowMessageBox;
+    AskYesNo = AskInMessageBox;
+    ChooseFileToOpen = ChooseInOpenDialog;
+    ChooseFileToSave = ChooseInSaveDialog;
+    WarningSound = PlayWarningSound;
+    Tell = TellScreenReader;
+    WindowInFront = NumberInFront;
     OnWayland = [] { return QGuiApplication::platformName().startsWith("wayland"); };
     ProgramFolder = [folder = FindProgramFolder()] { return folder; };
 }

@@ -25,7 +25,7 @@ void SetUpDialog(QFileDialog& dialog, const std::string& folder) {
 QString Run(QFileDialog& dialog) {
     const bool accepted = dialog.exec() == QDialog::Accepted;
     dialog.hide();
-    WindowFront::GiveBack();
+    Platform::GiveFrontBack();
     const QStringList files = dialog.selectedFiles();
     return accepted && !files.isEmpty() ? files.first() : QString();
 }
@@ -36,17 +36,17 @@ std::string PathOf(const QString& file) {
 
 bool MayReplace(const QString& file) {
     if (!QFileInfo::exists(file)) return true;
-    return MessageBox::Ask(
+    return Platform::AskInMessageBox(
         QFileInfo(file).fileName().toStdString() + " already exists. Do you want to replace it?",
         "Quorle");
 }
 
 }  // namespace
 
-namespace FileDialog {
+namespace Platform {
 
-std::string ChooseToOpen(const std::string& folder) {
-    QFileDialog dialog(WindowFront::Latest(), QFileDialog::tr("Open"));
+std::string ChooseInOpenDialog(const std::string& folder) {
+    QFileDialog dialog(LatestInFront(), QFileDialog::tr("Open"));
     SetUpDialog(dialog, folder);
     dialog.setFileMode(QFileDialog::ExistingFile);
     return PathOf(Run(dialog));
@@ -54,8 +54,8 @@ std::string ChooseToOpen(const std::string& folder) {
 
 // The suffix is added here, after the dialog has asked about the name as typed,
 // so that the name with its suffix is asked about as well.
-std::string ChooseToSave(const std::string& folder) {
-    QFileDialog dialog(WindowFront::Latest(), QFileDialog::tr("Save As"));
+std::string ChooseInSaveDialog(const std::string& folder) {
+    QFileDialog dialog(LatestInFront(), QFileDialog::tr("Save As"));
     SetUpDialog(dialog, folder);
     dialog.setAcceptMode(QFileDialog::AcceptSave);
     dialog.setFileMode(QFileDialog::AnyFile);
@@ -65,4 +65,4 @@ std::string ChooseToSave(const std::string& folder) {
     return MayReplace(file) ? PathOf(file) : std::string();
 }
 
-}  // namespace FileDialog
+}  // namespace Platform

@@ -2,14 +2,14 @@
 // The dialogs for word files.
 #include <string>
 
-namespace FileDialog {
+namespace Platform {
 
 /// The full path of the file chosen, empty when cancelled. Starts in `folder`
 /// with text files shown.
-std::string ChooseToOpen(const std::string& folder);
+std::string ChooseInOpenDialog(const std::string& folder);
 
 /// The same for saving: a name without a suffix gets ".txt", and a file that
 /// stands is replaced only when the player agrees.
-std::string ChooseToSave(const std::string& folder);
+std::string ChooseInSaveDialog(const std::string& folder);
 
-}  // namespace FileDialog
+}  // namespace Platform

@@ -2,12 +2,12 @@
 // Modal message boxes, centred on our window in front.
 #include <string>
 
-namespace MessageBox {
+namespace Platform {
 
 /// Waits until the player has pressed OK or Escape.
-void Show(const std::string& text, const std::string& title);
+void ShowMessageBox(const std::string& text, const std::string& title);
 
 /// True for Yes, false for No. Nothing else closes the box.
-bool Ask(const std::string& text, const std::string& title);
+bool AskInMessageBox(const std::string& text, const std::string& title);
 
-}  // namespace MessageBox
+}  // namespace Platform

@@ -64,14 +64,14 @@ void Announce(QWidget* window, const QString& text) {
 void TellAll() {
     const QString text = Untold;
     Untold.clear();
-    if (QWidget* window = WindowFront::Latest()) Announce(window, text);
+    if (QWidget* window = Platform::LatestInFront()) Announce(window, text);
 }
 
 }  // namespace
 
-namespace ScreenReader {
+namespace Platform {
 
-void Tell(const std::string& text) {
+void TellScreenReader(const std::string& text) {
     if (!QAccessible::isActive()) return;
     if (Untold.isEmpty()) {
         QTimer::singleShot(0, TellAll);
@@ -87,11 +87,11 @@ void TellValueOf(QComboBox* box, const QString& description) {
 #else
     const auto tell = [box, description](const QString& value) {
         box->setAccessibleDescription(value + ". " + description);
-        if (box->hasFocus() && !value.isEmpty()) Platform::Tell(value.toStdString());
+        if (box->hasFocus() && !value.isEmpty()) Tell(value.toStdString());
     };
     tell(box->currentText());
     QObject::connect(box, &QComboBox::currentTextChanged, box, tell);
 #endif
 }
 
-}  // namespace ScreenReader
+}  // namespace Platform

@@ -5,13 +5,13 @@
 
 class QComboBox;
 
-namespace ScreenReader {
+namespace Platform {
 
 /// Has a text said soon, wherever the focus is. What one event tells is said in one breath.
-void Tell(const std::string& text);
+void TellScreenReader(const std::string& text);
 
 /// Has a box without typing say its value when it gets the focus and whenever the player
 /// changes it. `description` is said with it.
 void TellValueOf(QComboBox* box, const QString& description);
 
-}  // namespace ScreenReader
+}  // namespace Platform

@@ -98,11 +98,11 @@ class Player {
 
 }  // namespace
 
-namespace WarningSound {
+namespace Platform {
 
-void Play() {
+void PlayWarningSound() {
     static auto* const player = new Player;
     player->request();
 }
 
-}  // namespace WarningSound
+}  // namespace Platform

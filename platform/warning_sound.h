@@ -1,10 +1,10 @@
 #pragma once
 // The desktop's warning sound.
 
-namespace WarningSound {
+namespace Platform {
 
 /// Asks for the sound and returns at once. What piles up while one is being
 /// started is played once.
-void Play();
+void PlayWarningSound();
 
-}  // namespace WarningSound
+}  // namespace Platform

@@ -27,12 +27,16 @@ std::int16_t WordPoints(std::string_view word) {
     return Points[length - Shortest];
 }
 
+}  // namespace Common
+
+namespace GameResults {
+
 void Count(Tally& tally, std::string_view word) {
     const auto add = [](std::int16_t sum, std::int16_t more) {
         return static_cast<std::int16_t>(std::min(sum + more, INT16_MAX));
     };
     tally.words = add(tally.words, 1);
-    tally.points = add(tally.points, WordPoints(word));
+    tally.points = add(tally.points, Common::WordPoints(word));
 }
 
 std::string WordsLine(const Tally& player, const Tally& computer) {
@@ -47,4 +51,4 @@ std::string BadWordsLine(std::int16_t words) {
     return CountedWords(words) + " not in dictionary";
 }
 
-}  // namespace Common
+}  // namespace GameResults
