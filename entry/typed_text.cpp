@@ -5,6 +5,23 @@
 #include "entry/check_cubes.h"
 #include "state/game_state.h"
 
+namespace {
+
+// Code points.
+std::size_t CharacterCount(std::string_view text) {
+    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) {
+        return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;  // not a continuation byte
+    }));
+}
+
+std::size_t FirstCharacterSize(std::string_view text) {
+    std::size_t size = 1;
+    while (size < text.size() && CharacterCount(text.substr(0, size + 1)) == 1) ++size;
+    return size;
+}
+
+}  // namespace
+
 namespace Entry {
 
 std::string LowerCase(std::string_view text) {
@@ -14,22 +31,6 @@ std::string LowerCase(std::string_view text) {
     });
     return lower;
 }
-
-std::size_t CharacterCount(std::string_view text) {
-    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) {
-        return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;  // not a continuation byte
-    }));
-}
-
-namespace {
-
-std::size_t FirstCharacterSize(std::string_view text) {
-    std::size_t size = 1;
-    while (size < text.size() && CharacterCount(text.substr(0, size + 1)) == 1) ++size;
-    return size;
-}
-
-}  // namespace
 
 TypedCut CutToBoard(std::string_view text) {
     State.LastTypedText = text;

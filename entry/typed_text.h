@@ -9,9 +9,6 @@ namespace Entry {
 /// A text in lower case; only ASCII letters change, and only they are words.
 std::string LowerCase(std::string_view text);
 
-/// The number of characters (code points).
-std::size_t CharacterCount(std::string_view text);
-
 struct TypedCut {
     std::size_t kept;      ///< bytes that stay, from the front
     std::size_t takenOff;  ///< characters taken off the end, a warning sound each

@@ -1,13 +1,8 @@
-// The desktop's own functions behind the platform's names.
+#include "platform/desktop.h"
+
 #include <QGuiApplication>
 
-#include "platform/file_dialog.h"
-#include "platform/message_box.h"
 #include "platform/platform.h"
-#include "platform/program_folder.h"
-#include "platform/screen_reader.h"
-#include "platform/warning_sound.h"
-#include "platform/window_front.h"
 
 namespace Platform {
 

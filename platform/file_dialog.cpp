@@ -1,9 +1,8 @@
-#include "platform/file_dialog.h"
+#include "platform/desktop.h"
 
 #include <QFileDialog>
 #include <QFileInfo>
 
-#include "platform/message_box.h"
 #include "platform/window_front.h"
 
 namespace {

@@ -1,4 +1,4 @@
-#include "platform/message_box.h"
+#include "platform/desktop.h"
 
 #include <QCloseEvent>
 #include <QKeyEvent>

@@ -1,4 +1,4 @@
-#include "platform/program_folder.h"
+#include "platform/desktop.h"
 
 #include <quorle/word_engine.h>
 

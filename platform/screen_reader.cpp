@@ -5,6 +5,7 @@
 #include <QPointer>
 #include <QTimer>
 
+#include "platform/desktop.h"
 #include "platform/platform.h"
 #include "platform/window_front.h"
 

@@ -1,4 +1,4 @@
-#include "platform/warning_sound.h"
+#include "platform/desktop.h"
 
 #include <canberra.h>
 

@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 
+#include "platform/desktop.h"
 #include "platform/platform.h"
 
 namespace {

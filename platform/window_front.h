@@ -3,7 +3,6 @@
 // every desktop gives the front back when a box closes or a window hides, and
 // with no window in front the game's clock stands still; so we do it ourselves.
 #include <QWidget>
-#include <cstdint>
 
 namespace Platform {
 
@@ -35,8 +34,5 @@ void GiveFrontBack();
 
 /// The followed window that is or last was in front and is shown; may be null.
 QWidget* LatestInFront();
-
-/// See Platform::WindowInFront.
-std::int32_t NumberInFront();
 
 }  // namespace Platform
