@@ -51,13 +51,9 @@ void ConnectEvents(const Main& window) {
 
 }  // namespace
 
-namespace App {
-
-Main& LoadMainWindow() {
+Main& App::LoadMainWindow() {
     Main& window = Windows::Shared<Main>();
     ConnectEvents(window);
     Common::StartUp();
     return window;
 }
-
-}  // namespace App

@@ -37,9 +37,7 @@ void CloseIfOpen() {
 
 }  // namespace
 
-namespace Common {
-
-void ExitProgram() {
+void Common::ExitProgram() {
     Dictionary::StopMerge();  // timers run under the question, too
     OfferDictionarySave();
     CloseIfOpen<Progress>();
@@ -49,8 +47,6 @@ void ExitProgram() {
     CloseIfOpen<DictionaryEditor>();
     Windows::Shared<Main>().close();
 }
-
-}  // namespace Common
 
 void App::DestroyWindows() {
     delete Windows::Existing<Results>;

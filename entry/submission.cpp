@@ -62,9 +62,7 @@ void EmptyNewWord(Main& window) {
 
 }  // namespace
 
-namespace Entry {
-
-void Submit() {
+void Entry::Submit() {
     if (State.TimeRemaining == 0) return;
     Main& window = Windows::Shared<Main>();
     const std::string word = LowerCase(window.NewWord->text().toStdString());
@@ -90,5 +88,3 @@ void Submit() {
     Platform::SetDefaultButton(&window, window.Enter);
     Common::DrawAllCubesNormal();
 }
-
-}  // namespace Entry

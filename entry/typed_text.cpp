@@ -22,9 +22,7 @@ std::size_t FirstCharacterSize(std::string_view text) {
 
 }  // namespace
 
-namespace Entry {
-
-std::string LowerCase(std::string_view text) {
+std::string Entry::LowerCase(std::string_view text) {
     std::string lower(text);
     std::transform(lower.begin(), lower.end(), lower.begin(), [](char c) {
         return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
@@ -32,7 +30,7 @@ std::string LowerCase(std::string_view text) {
     return lower;
 }
 
-TypedCut CutToBoard(std::string_view text) {
+Entry::TypedCut Entry::CutToBoard(std::string_view text) {
     State.LastTypedText = text;
     if (State.PickedWord == LowerCase(text)) return {text.size(), 0, false};
     const std::size_t kept = CheckCubes::LongestOnBoard(text);
@@ -44,5 +42,3 @@ TypedCut CutToBoard(std::string_view text) {
     }
     return {kept, CharacterCount(text.substr(kept)), true};
 }
-
-}  // namespace Entry

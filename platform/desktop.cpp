@@ -4,9 +4,7 @@
 
 #include "platform/platform.h"
 
-namespace Platform {
-
-void UseDesktop() {
+void Platform::UseDesktop() {
     ShowMessage = ShowMessageBox;
     AskYesNo = AskInMessageBox;
     ChooseFileToOpen = ChooseInOpenDialog;
@@ -17,5 +15,3 @@ void UseDesktop() {
     OnWayland = [] { return QGuiApplication::platformName().startsWith("wayland"); };
     ProgramFolder = [folder = FindProgramFolder()] { return folder; };
 }
-
-}  // namespace Platform

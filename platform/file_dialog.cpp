@@ -3,6 +3,7 @@
 #include <QFileDialog>
 #include <QFileInfo>
 
+#include "platform/platform.h"
 #include "platform/window_front.h"
 
 namespace {
@@ -37,14 +38,12 @@ bool MayReplace(const QString& file) {
     if (!QFileInfo::exists(file)) return true;
     return Platform::AskInMessageBox(
         QFileInfo(file).fileName().toStdString() + " already exists. Do you want to replace it?",
-        "Quorle");
+        Platform::ProgramTitle);
 }
 
 }  // namespace
 
-namespace Platform {
-
-std::string ChooseInOpenDialog(const std::string& folder) {
+std::string Platform::ChooseInOpenDialog(const std::string& folder) {
     QFileDialog dialog(LatestInFront(), QFileDialog::tr("Open"));
     SetUpDialog(dialog, folder);
     dialog.setFileMode(QFileDialog::ExistingFile);
@@ -53,7 +52,7 @@ std::string ChooseInOpenDialog(const std::string& folder) {
 
 // The suffix is added here, after the dialog has asked about the name as typed,
 // so that the name with its suffix is asked about as well.
-std::string ChooseInSaveDialog(const std::string& folder) {
+std::string Platform::ChooseInSaveDialog(const std::string& folder) {
     QFileDialog dialog(LatestInFront(), QFileDialog::tr("Save As"));
     SetUpDialog(dialog, folder);
     dialog.setAcceptMode(QFileDialog::AcceptSave);
@@ -63,5 +62,3 @@ std::string ChooseInSaveDialog(const std::string& folder) {
     file += ".txt";
     return MayReplace(file) ? PathOf(file) : std::string();
 }
-
-}  // namespace Platform

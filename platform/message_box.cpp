@@ -38,14 +38,10 @@ QMessageBox::StandardButton Run(const std::string& text, const std::string& titl
 
 }  // namespace
 
-namespace Platform {
-
-void ShowMessageBox(const std::string& text, const std::string& title) {
+void Platform::ShowMessageBox(const std::string& text, const std::string& title) {
     Run<QMessageBox>(text, title, QMessageBox::Ok);
 }
 
-bool AskInMessageBox(const std::string& text, const std::string& title) {
+bool Platform::AskInMessageBox(const std::string& text, const std::string& title) {
     return Run<Question>(text, title, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
-
-}  // namespace Platform

@@ -70,9 +70,7 @@ void TellAll() {
 
 }  // namespace
 
-namespace Platform {
-
-void TellScreenReader(const std::string& text) {
+void Platform::TellScreenReader(const std::string& text) {
     if (!QAccessible::isActive()) return;
     if (Untold.isEmpty()) {
         QTimer::singleShot(0, TellAll);
@@ -82,7 +80,7 @@ void TellScreenReader(const std::string& text) {
     Untold += QString::fromStdString(text);
 }
 
-void TellValueOf(QComboBox* box, const QString& description) {
+void Platform::TellValueOf(QComboBox* box, const QString& description) {
 #if QT_VERSION >= QT_VERSION_CHECK(6, 8, 0)
     box->setAccessibleDescription(description);  // the toolkit tells the value itself
 #else
@@ -94,5 +92,3 @@ void TellValueOf(QComboBox* box, const QString& description) {
     QObject::connect(box, &QComboBox::currentTextChanged, box, tell);
 #endif
 }
-
-}  // namespace Platform

@@ -98,11 +98,7 @@ class Player {
 
 }  // namespace
 
-namespace Platform {
-
-void PlayWarningSound() {
+void Platform::PlayWarningSound() {
     static auto* const player = new Player;
     player->request();
 }
-
-}  // namespace Platform

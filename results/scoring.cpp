@@ -18,16 +18,12 @@ std::string OutOf(std::int16_t part, std::int16_t whole) {
 
 }  // namespace
 
-namespace Common {
-
-std::int16_t WordPoints(std::string_view word) {
+std::int16_t Common::WordPoints(std::string_view word) {
     constexpr std::size_t Shortest = 4;
     constexpr std::array<std::int16_t, 5> Points{1, 2, 3, 5, 11};  // of 4, 5, 6, 7, 8 letters
     const std::size_t length = std::clamp<std::size_t>(word.size(), Shortest, 8);
     return Points[length - Shortest];
 }
-
-}  // namespace Common
 
 namespace GameResults {
 
