@@ -33,15 +33,15 @@ void FinishWindow() {
     for (const char* size : {"48", "128"}) icon.addFile(QString(":/quorle-%1.png").arg(size));
     QApplication::setWindowIcon(icon);
     const Main& window = Windows::Shared<Main>();
-    TilePicture(true, QString(), window.devicePixelRatioF(),
-                window.palette().color(QPalette::Window));
-    TrimHeap();
+    MainWindow::TilePicture(true, QString(), window.devicePixelRatioF(),
+                            window.palette().color(QPalette::Window));
+    Platform::TrimHeap();
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
-    PrepareHeap();
+    Platform::PrepareHeap();
     Platform::UseDesktop();
     // Every window made anew has its pictures cached once more; ten times this is Qt's own bound.
     QPixmapCache::setCacheLimit(PictureCache);
@@ -54,12 +54,12 @@ int main(int argc, char** argv) {
     QApplication::setDesktopFileName("quorle");
     // Hiding the last window shown must not end the program; closing Main does.
     QApplication::setQuitOnLastWindowClosed(false);
-    Main& window = Common::LoadMainWindow();
+    Main& window = App::LoadMainWindow();
     CentreOnScreen(window);
-    FollowSessionEnd([&window] { window.close(); });
+    Platform::FollowSessionEnd([&window] { window.close(); });
     window.show();
     QTimer::singleShot(AfterFirstPaint, &window, FinishWindow);
     const int result = QApplication::exec();
-    Common::DestroyWindows();
+    App::DestroyWindows();
     return result;
 }

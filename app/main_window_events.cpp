@@ -23,8 +23,8 @@
 namespace {
 
 void ConnectTile(const CubeTile& tile, std::int16_t k) {
-    QObject::connect(&tile, &CubeTile::clicked, [k] { Common::CubeClick(k); });
-    QObject::connect(&tile, &CubeTile::doubleClicked, [k] { Common::CubeDoubleClick(k); });
+    QObject::connect(&tile, &CubeTile::clicked, [k] { Entry::CubeClick(k); });
+    QObject::connect(&tile, &CubeTile::doubleClicked, [k] { Entry::CubeDoubleClick(k); });
 }
 
 void ConnectEvents(const Main& window) {
@@ -36,13 +36,13 @@ void ConnectEvents(const Main& window) {
     on(window.End, &QToolButton::clicked, Common::StopGame);
     on(window.Options, &QToolButton::clicked, Common::ShowOptions);
     on(window.Dictionary, &QToolButton::clicked, Dictionary::OpenEditor);
-    on(window.HelpButton, &QToolButton::clicked, Common::OpenHelp);
+    on(window.HelpButton, &QToolButton::clicked, Help::Open);
     on(window.Exit, &QToolButton::clicked, Common::ExitProgram);
-    on(window.NewWord, &QLineEdit::textChanged, Common::WordTyped);
-    on(window.Enter, &QPushButton::clicked, Common::Submit);
-    on(window.Clear, &QPushButton::clicked, Common::ClearLetter);
+    on(window.NewWord, &QLineEdit::textChanged, Entry::WordTyped);
+    on(window.Enter, &QPushButton::clicked, Entry::Submit);
+    on(window.Clear, &QPushButton::clicked, Entry::ClearLetter);
     on(window.GameClock, &QTimer::timeout, Common::ClockTick);
-    on(window.TellKey, &QShortcut::activated, Common::TellGame);
+    on(window.TellKey, &QShortcut::activated, Game::TellGame);
     on(&window, &Main::closing, Common::ExitProgram);
     for (std::int16_t k = 0; k < CubeCount; ++k) {
         ConnectTile(*window.Cube[static_cast<std::size_t>(k)], k);
@@ -51,13 +51,9 @@ void ConnectEvents(const Main& window) {
 
 }  // namespace
 
-namespace Common {
-
-Main& LoadMainWindow() {
+Main& App::LoadMainWindow() {
     Main& window = Windows::Shared<Main>();
     ConnectEvents(window);
-    StartUp();
+    Common::StartUp();
     return window;
 }
-
-}  // namespace Common

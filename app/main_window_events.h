@@ -3,10 +3,10 @@
 
 class Main;
 
-namespace Common {
+namespace App {
 
 /// Makes the main window, connects its events and runs the program's start-up; the
 /// window is not yet shown. Once, before any procedure.
 Main& LoadMainWindow();
 
-}  // namespace Common
+}  // namespace App

@@ -37,9 +37,7 @@ void CloseIfOpen() {
 
 }  // namespace
 
-namespace Common {
-
-void ExitProgram() {
+void Common::ExitProgram() {
     Dictionary::StopMerge();  // timers run under the question, too
     OfferDictionarySave();
     CloseIfOpen<Progress>();
@@ -50,7 +48,7 @@ void ExitProgram() {
     Windows::Shared<Main>().close();
 }
 
-void DestroyWindows() {
+void App::DestroyWindows() {
     delete Windows::Existing<Results>;
     delete Windows::Existing<Progress>;
     delete Windows::Existing<DictionaryEditor>;
@@ -58,5 +56,3 @@ void DestroyWindows() {
     delete Windows::Existing<HelpBrowser>;
     delete Windows::Existing<Main>;
 }
-
-}  // namespace Common

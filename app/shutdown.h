@@ -7,7 +7,11 @@ namespace Common {
 /// do the second time.
 void ExitProgram();
 
+}  // namespace Common
+
+namespace App {
+
 /// Deletes every window, the main window last. Before the QApplication goes.
 void DestroyWindows();
 
-}  // namespace Common
+}  // namespace App

@@ -13,11 +13,9 @@
 #include "state/game_state.h"
 #include "state/windows.h"
 
-namespace Common {
-
 // The dictionary comes before the settings: the stored maximum word size is
 // settled with the dictionary's own.
-void StartUp() {
+void Common::StartUp() {
     QTableWidget& list = *Windows::Shared<Main>().WordList;
     Dictionary::LoadDictionary();
     Dice::FillCubeFaces();
@@ -34,5 +32,3 @@ void StartUp() {
     State.MaxWordSizeOption = static_cast<std::int16_t>(cMaxWordSize());
     Platform::SeedRandom();
 }
-
-}  // namespace Common

@@ -35,12 +35,12 @@ void DrawAllCubesNormal() {
     for (std::int16_t k = 0; k < CubeCount; ++k) DrawCubeNormal(k);
 }
 
-void DrawTracedPath() {
+}  // namespace Common
+
+void Board::DrawTracedPath() {
     for (std::int16_t k = 0; k < CubeCount; ++k) {
         const auto index = static_cast<std::size_t>(k);
         const bool traced = State.TracedPath[index / BoardSize][index % BoardSize];
         DrawCube(k, traced ? DrawnSelected : DrawnNormal);
     }
 }
-
-}  // namespace Common

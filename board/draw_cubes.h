@@ -11,7 +11,11 @@ void DrawCubeSelected(std::int16_t k);
 
 void DrawAllCubesNormal();
 
+}  // namespace Common
+
+namespace Board {
+
 /// Shows the tiles that TracedPath marks selected, the others normal.
 void DrawTracedPath();
 
-}  // namespace Common
+}  // namespace Board

@@ -4,11 +4,15 @@
 
 #include "platform/platform.h"
 
-namespace Dictionary {
+namespace {
 
 std::string FilePath() {
     return Platform::ProgramFolder() + "/Dictionary.dat";
 }
+
+}  // namespace
+
+namespace Dictionary {
 
 void LoadDictionary() {
     State.LetterBase = 'a';

@@ -6,9 +6,6 @@
 
 namespace Dictionary {
 
-/// The path of Dictionary.dat.
-std::string FilePath();
-
 /// Loads Dictionary.dat; where that fails, the engine keeps what it holds: nothing, or the
 /// installed words where a copy of them could not be written.
 void LoadDictionary();

@@ -51,10 +51,10 @@ namespace Dictionary {
 void OpenEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     ListStartingLetters(True);
-    SetDefaultButton(&editor, editor.Add);
+    Platform::SetDefaultButton(&editor, editor.Add);
     ListWords();
     editor.waitsForGameEnd = false;
-    WindowFront::Bring(editor);
+    Platform::BringToFront(editor);
     editor.NewWord->setFocus();
 }
 
@@ -102,8 +102,8 @@ void SaveAsText() {
 void LeaveEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     editor.Words->setStringList({});
-    WindowFront::Hide(editor);
-    WindowFront::Bring(Windows::Shared<Main>());
+    Platform::HideWindow(editor);
+    Platform::BringToFront(Windows::Shared<Main>());
 }
 
 }  // namespace Dictionary

@@ -21,6 +21,8 @@
 #include "state/game_rules.h"
 #include "state/windows.h"
 
+using namespace Platform;
+
 namespace {
 
 constexpr int ClientWidth = 5910;
@@ -80,7 +82,7 @@ void DictionaryEditor::makeMenu() {
 void DictionaryEditor::makeLists() {
     StartingLetters = new QComboBox(client_);
     SetUp(StartingLetters, "StartingLetters", {120, 120, 3855, 540}, WordFont());
-    ScreenReader::TellValueOf(StartingLetters, "Starting letters");
+    TellValueOf(StartingLetters, "Starting letters");
     StartingLetters->setMaxVisibleItems(PrefixesInView);
     connect(StartingLetters, &QComboBox::currentIndexChanged, this,
             [] { Dictionary::ListWords(); });

@@ -53,8 +53,8 @@ QStringList WordsWith(const QString& prefix) {
 }
 
 void ShowWordCount(QLabel& label) {
-    ShowFitting(label, LayoutFont(Typeface::SansSerif, 12),
-                QString("%1 words").arg(cNumberOfWords()));
+    Platform::ShowFitting(label, Platform::LayoutFont(Platform::Typeface::SansSerif, 12),
+                          QString("%1 words").arg(cNumberOfWords()));
 }
 
 }  // namespace
@@ -92,10 +92,10 @@ void ShowEditor() {
     if (editor.waitsForGameEnd) return;
     editor.NewWord->setFocus();
     const bool boxIsUp = QApplication::activeModalWidget() != nullptr;
-    if (playing || boxIsUp || !WindowFront::IsOurs()) {
-        WindowFront::ShowBehind(editor);
+    if (playing || boxIsUp || !Platform::FrontIsOurs()) {
+        Platform::ShowBehind(editor);
     } else {
-        WindowFront::Bring(editor);
+        Platform::BringToFront(editor);
     }
 }
 

@@ -28,7 +28,7 @@ std::int32_t Read(const char* path) {
 }
 
 void SetBarWidth(QLabel& bar, double twips) {
-    bar.resize(Twips(qRound(twips)), bar.height());
+    bar.resize(Platform::Twips(qRound(twips)), bar.height());
 }
 
 void ShowProgress(Progress& window, std::int32_t percent) {
@@ -40,7 +40,7 @@ void ShowProgressWindow(Progress& window) {
     window.ProgressLabel->setText("Merging words...");
     window.Display();
     if (State.ProgressFullWidth == 0) {
-        const int width = window.ProgressIndicator->width() * TwipsPerPixel;
+        const int width = window.ProgressIndicator->width() * Platform::TwipsPerPixel;
         State.ProgressFullWidth = static_cast<std::int16_t>(width);
     }
 }
@@ -77,7 +77,7 @@ void StartMerge() {
         TellMerged();
         return;
     }
-    WindowFront::Hide(Windows::Shared<DictionaryEditor>());
+    Platform::HideWindow(Windows::Shared<DictionaryEditor>());
     Progress& window = Windows::Shared<Progress>();
     Platform::Tell("merging");
     ShowProgressWindow(window);

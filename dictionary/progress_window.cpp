@@ -11,6 +11,8 @@
 #include "platform/platform.h"
 #include "state/windows.h"
 
+using namespace Platform;
+
 namespace {
 
 constexpr int ClientWidth = 4200;
@@ -29,7 +31,7 @@ void Fill(QLabel& label, const QColor& colour) {
 
 // On Wayland every window gets the focus when it is shown, but no tool tip.
 Qt::WindowType Kind() {
-    return Platform::OnWayland() ? Qt::ToolTip : Qt::Window;
+    return OnWayland() ? Qt::ToolTip : Qt::Window;
 }
 
 }  // namespace
@@ -55,7 +57,7 @@ Progress::Progress() {
 void Progress::Display() {
     const Main& main = Windows::Shared<Main>();
     move(main.frameGeometry().center() - rect().center());
-    if (Platform::OnWayland()) {
+    if (OnWayland()) {
         winId();
         windowHandle()->setTransientParent(main.windowHandle());
     }

@@ -1,6 +1,8 @@
 #include "entry/check_cubes.h"
 
 #include <algorithm>
+#include <optional>
+#include <vector>
 
 namespace {
 
@@ -40,9 +42,11 @@ bool TraceFrom(std::size_t fromRow, std::size_t fromColumn, std::string_view res
     return false;
 }
 
-}  // namespace
-
-namespace CheckCubes {
+struct Trace {
+    Boolean found;
+    std::optional<BoardMarks> path;
+    std::vector<std::size_t> chain;  // the path's board indexes in the word's order
+};
 
 Trace TraceWord(std::string_view word) {
     if (word.empty()) return {True, BoardMarks{}, {}};
@@ -63,6 +67,10 @@ Trace TraceWord(std::string_view word) {
     }
     return {False, path, {}};
 }
+
+}  // namespace
+
+namespace CheckCubes {
 
 Boolean IsOnBoard(std::string_view word) {
     const Trace trace = TraceWord(word);

@@ -33,12 +33,12 @@ void ListWord(Main& window, const std::string& word) {
     const QString text = QString::fromStdString(word);
     list.insertRow(0);
     auto* cell = new QTableWidgetItem(text);
-    QFont font = Condensed(WordFont(), text, RowTextWidth(list));
+    QFont font = Platform::Condensed(Platform::WordFont(), text, Platform::RowTextWidth(list));
     const bool known = Dictionary::IsInDictionary(word);
     if (!known) {
         font.setStrikeOut(true);
         cell->setData(Qt::AccessibleDescriptionRole, "not in dictionary");
-        Common::PlayWarning();
+        Entry::PlayWarning();
     }
     cell->setFont(font);
     list.setItem(0, 0, cell);
@@ -62,9 +62,7 @@ void EmptyNewWord(Main& window) {
 
 }  // namespace
 
-namespace Common {
-
-void Submit() {
+void Entry::Submit() {
     if (State.TimeRemaining == 0) return;
     Main& window = Windows::Shared<Main>();
     const std::string word = LowerCase(window.NewWord->text().toStdString());
@@ -87,8 +85,6 @@ void Submit() {
     }
     window.NewWord->clear();
     window.NewWord->setFocus();
-    SetDefaultButton(&window, window.Enter);
-    DrawAllCubesNormal();
+    Platform::SetDefaultButton(&window, window.Enter);
+    Common::DrawAllCubesNormal();
 }
-
-}  // namespace Common

@@ -1,10 +1,10 @@
 #pragma once
 // Submitting the word in NewWord to the player's list.
 
-namespace Common {
+namespace Entry {
 
 /// Checks the word against the word sizes, the board and the words entered, and
 /// lists it on top, struck through when the dictionary does not hold it.
 void Submit();
 
-}  // namespace Common
+}  // namespace Entry

@@ -5,21 +5,14 @@
 #include "entry/check_cubes.h"
 #include "state/game_state.h"
 
-std::string LowerCase(std::string_view text) {
-    std::string lower(text);
-    std::transform(lower.begin(), lower.end(), lower.begin(), [](char c) {
-        return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-    });
-    return lower;
-}
+namespace {
 
+// Code points.
 std::size_t CharacterCount(std::string_view text) {
     return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) {
         return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;  // not a continuation byte
     }));
 }
-
-namespace {
 
 std::size_t FirstCharacterSize(std::string_view text) {
     std::size_t size = 1;
@@ -29,7 +22,15 @@ std::size_t FirstCharacterSize(std::string_view text) {
 
 }  // namespace
 
-TypedCut CutToBoard(std::string_view text) {
+std::string Entry::LowerCase(std::string_view text) {
+    std::string lower(text);
+    std::transform(lower.begin(), lower.end(), lower.begin(), [](char c) {
+        return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+    });
+    return lower;
+}
+
+Entry::TypedCut Entry::CutToBoard(std::string_view text) {
     State.LastTypedText = text;
     if (State.PickedWord == LowerCase(text)) return {text.size(), 0, false};
     const std::size_t kept = CheckCubes::LongestOnBoard(text);

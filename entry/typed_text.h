@@ -4,11 +4,10 @@
 #include <string>
 #include <string_view>
 
+namespace Entry {
+
 /// A text in lower case; only ASCII letters change, and only they are words.
 std::string LowerCase(std::string_view text);
-
-/// The number of characters (code points).
-std::size_t CharacterCount(std::string_view text);
 
 struct TypedCut {
     std::size_t kept;      ///< bytes that stay, from the front
@@ -20,3 +19,5 @@ struct TypedCut {
 /// the clicks have built stays untraced; anything else is cut back until it lies
 /// on the board.
 TypedCut CutToBoard(std::string_view text);
+
+}  // namespace Entry

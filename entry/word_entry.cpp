@@ -27,7 +27,7 @@ void SetText(const std::string& text) {
 }
 
 bool EndsInQu(const std::string& text) {
-    return text.size() >= 2 && LowerCase(text.substr(text.size() - 2)) == "qu";
+    return text.size() >= 2 && Entry::LowerCase(text.substr(text.size() - 2)) == "qu";
 }
 
 bool IsLastPicked(std::int16_t k) {
@@ -53,7 +53,7 @@ void ForgetPicks() {
 
 // With no click left to undo there is no tile to turn either.
 void UndoPick(const std::string& shorter) {
-    if (!State.PickedWord.starts_with(LowerCase(shorter))) return;
+    if (!State.PickedWord.starts_with(Entry::LowerCase(shorter))) return;
     State.PickedWord.resize(shorter.size());
     if (State.PickedCount == 0) return;
     Common::DrawCubeNormal(State.PickedCubes[static_cast<std::size_t>(State.PickedCount)]);
@@ -67,7 +67,7 @@ void TellTakenOff(const std::string& letters) {
 
 }  // namespace
 
-namespace Common {
+namespace Entry {
 
 // Taking untraceable letters off one by one would run this handler nested in
 // itself, once for each. The outcome is worked out first instead, and the text
@@ -75,7 +75,7 @@ namespace Common {
 void WordTyped() {
     const std::string text = TypedText();
     if (text.empty() && !State.LastTypedText.empty()) {
-        DrawAllCubesNormal();
+        Common::DrawAllCubesNormal();
         return;
     }
     const TypedCut cut = CutToBoard(text);
@@ -85,7 +85,7 @@ void WordTyped() {
         SetText(text.substr(0, cut.kept));
         TellTakenOff(text.substr(cut.kept));
     }
-    DrawTracedPath();
+    Board::DrawTracedPath();
 }
 
 void CubeClick(std::int16_t k) {
@@ -128,4 +128,4 @@ void PlayWarning() {
     if (State.Sounds) Platform::WarningSound();
 }
 
-}  // namespace Common
+}  // namespace Entry

@@ -2,7 +2,7 @@
 // Building a word in NewWord by typing and clicking, its chain lit on the board.
 #include <cstdint>
 
-namespace Common {
+namespace Entry {
 
 /// The typing handler: runs on every change of NewWord's text, whatever its cause.
 void WordTyped();
@@ -17,4 +17,4 @@ void ClearLetter();
 /// Plays the warning sound when the player wants sounds.
 void PlayWarning();
 
-}  // namespace Common
+}  // namespace Entry

@@ -22,7 +22,7 @@
 namespace {
 
 QString TimeText(std::int16_t seconds) {
-    return QString::fromStdString(FormatTime(seconds));
+    return QString::fromStdString(Common::FormatTime(seconds));
 }
 
 void FillBoard() {
@@ -40,12 +40,12 @@ void OpenWordEntry(Main& window) {
     window.NewWord->setFocus();
     State.PickedWord.clear();
     State.PickedCount = 0;
-    SetDefaultButton(&window, window.Enter);
+    Platform::SetDefaultButton(&window, window.Enter);
 }
 
 void ShowComputerWordCount(QLabel& label) {
-    ShowFitting(label, LayoutFont(Typeface::SansSerif, 13.5),
-                QString("Quorle found %1 words").arg(State.ComputerWordCount));
+    Platform::ShowFitting(label, Platform::LayoutFont(Platform::Typeface::SansSerif, 13.5),
+                          QString("Quorle found %1 words").arg(State.ComputerWordCount));
 }
 
 // The window in front at the first counted tick is the one the clock needs from
@@ -73,7 +73,7 @@ void StartGame() {
     State.TimeRemaining = State.TimeLimit;
     window.SetTimeLabels("Time Remaining", TimeText(State.TimeLimit));
     window.GameClock->start();
-    TellNewBoard();
+    Game::TellNewBoard();
 }
 
 void PauseGame() {
@@ -95,7 +95,7 @@ void ClockTick() {
     if (State.Paused || !ClockMayCount()) return;
     --State.TimeRemaining;
     Windows::Shared<Main>().TimeLeft->setText(TimeText(State.TimeRemaining));
-    TellTimeLeft();
+    Game::TellTimeLeft();
     if (State.TimeRemaining == 0) EndGame("Time is up");
 }
 

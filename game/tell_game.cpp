@@ -38,7 +38,7 @@ std::string TextOf(const QLabel& label) {
 
 }  // namespace
 
-namespace Common {
+namespace Game {
 
 void TellNewBoard() {
     const Main& window = Windows::Shared<Main>();
@@ -60,4 +60,4 @@ void TellTimeLeft() {
     if (left == 60 || left == 30 || left == 10) Platform::Tell(SpokenTime(left) + " left");
 }
 
-}  // namespace Common
+}  // namespace Game

@@ -1,7 +1,7 @@
 #pragma once
 // What a screen reader is told of the game's board and time.
 
-namespace Common {
+namespace Game {
 
 /// The board that has just been shaken.
 void TellNewBoard();
@@ -12,4 +12,4 @@ void TellGame();
 /// The time left, at a minute, 30 and 10 seconds.
 void TellTimeLeft();
 
-}  // namespace Common
+}  // namespace Game

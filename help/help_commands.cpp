@@ -8,23 +8,23 @@
 #include "platform/platform.h"
 #include "state/windows.h"
 
-namespace Common {
+namespace Help {
 
-void OpenHelp() {
-    ShowHelpPage();
+void Open() {
+    ShowPage();
     HelpBrowser& window = Windows::Shared<HelpBrowser>();
-    WindowFront::Float(window);
-    WindowFront::Bring(window);
+    Platform::FloatWindow(window);
+    Platform::BringToFront(window);
 }
 
-void ShowHelpPage() {
+void ShowPage() {
     const std::string page = Platform::ProgramFolder() + "/Quorle.htm";
     Windows::Shared<HelpBrowser>().WebBrowser->setSource(
         QUrl::fromLocalFile(QFile::decodeName(page.c_str())));
 }
 
-void HideHelp() {
-    WindowFront::Hide(Windows::Shared<HelpBrowser>());
+void Hide() {
+    Platform::HideWindow(Windows::Shared<HelpBrowser>());
 }
 
-}  // namespace Common
+}  // namespace Help

@@ -1,14 +1,14 @@
 #pragma once
 
-namespace Common {
+namespace Help {
 
 /// Opens the help window at the help page.
-void OpenHelp();
+void Open();
 
 /// Lets the help window show the help page again.
-void ShowHelpPage();
+void ShowPage();
 
 /// Hides the help window; its history stays.
-void HideHelp();
+void Hide();
 
-}  // namespace Common
+}  // namespace Help

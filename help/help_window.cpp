@@ -9,6 +9,8 @@
 #include "platform/menu_bar.h"
 #include "state/windows.h"
 
+using namespace Platform;
+
 namespace {
 
 constexpr int ClientWidth = 8505;
@@ -44,10 +46,10 @@ void HelpBrowser::makeCommands() {
     Back = addCommand("Back");
     Forward = addCommand("Forward");
     Exit = addCommand("Exit");
-    connect(Contents, &QAction::triggered, this, [] { Common::ShowHelpPage(); });
+    connect(Contents, &QAction::triggered, this, [] { Help::ShowPage(); });
     connect(Back, &QAction::triggered, WebBrowser, &QTextBrowser::backward);
     connect(Forward, &QAction::triggered, WebBrowser, &QTextBrowser::forward);
-    connect(Exit, &QAction::triggered, this, [] { Common::HideHelp(); });
+    connect(Exit, &QAction::triggered, this, [] { Help::Hide(); });
     FillBelow(bar, WebBrowser);
     resize(Twips(ClientWidth), Twips(ClientHeight) + bar->heightForWidth(Twips(ClientWidth)));
 }
@@ -55,6 +57,6 @@ void HelpBrowser::makeCommands() {
 // Closed by its title bar the window goes with its history.
 void HelpBrowser::closeEvent(QCloseEvent* event) {
     event->accept();
-    WindowFront::Hide(*this);
+    HideWindow(*this);
     Windows::Discard<HelpBrowser>();
 }

@@ -42,7 +42,8 @@ void CubeTile::paintEvent(QPaintEvent*) {
     const QColor background = palette().color(QPalette::Window);
     QPainter painter(this);
     painter.fillRect(rect(), background);
-    painter.drawPixmap(0, 0, TilePicture(selected_, letter_, devicePixelRatioF(), background));
+    painter.drawPixmap(
+        0, 0, MainWindow::TilePicture(selected_, letter_, devicePixelRatioF(), background));
 }
 
 void CubeTile::mousePressEvent(QMouseEvent* event) {

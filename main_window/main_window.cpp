@@ -21,6 +21,9 @@
 #include "platform/window_accessible.h"
 #include "platform/window_size.h"
 
+using namespace MainWindow;
+using namespace Platform;
+
 namespace {
 
 constexpr int ClientWidth = 9300;
@@ -46,7 +49,7 @@ QFont SmallerFont() {
 Main::Main() {
     MakeWindowsAccessible();  // first: the toolkit keeps what it made of a window once
     setObjectName("Main");
-    setWindowTitle(Platform::ProgramTitle);
+    setWindowTitle(ProgramTitle);
     setWindowFlags(Qt::Window | Qt::WindowTitleHint | Qt::WindowSystemMenuHint |
                    Qt::WindowMinimizeButtonHint | Qt::WindowCloseButtonHint);
     SetOnlySize(*this, {Twips(ClientWidth), Twips(ClientHeight)});

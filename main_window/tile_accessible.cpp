@@ -35,6 +35,6 @@ QAccessibleInterface* MakeInterface(const QString&, QObject* object) {
 
 }  // namespace
 
-void MakeTilesAccessible() {
+void MainWindow::MakeTilesAccessible() {
     QAccessible::installFactory(MakeInterface);
 }

@@ -9,6 +9,8 @@
 
 namespace {
 
+using MainWindow::TileSize;
+
 // The artwork is drawn with hard edges at four times the resolution, combined
 // there bit by bit and scaled down smoothly: combining soft edges bit by bit
 // would leave a pale fringe. It is done in bands, for memory touched for the
@@ -117,7 +119,7 @@ QPixmap BlankTile(bool selected, qreal pixelRatio, QColor background) {
 // Centred by what is seen of the letter, which its advance and ascent are not.
 void PrintLetter(QPaintDevice* tile, const QString& letter) {
     QPainterPath glyphs;
-    glyphs.addText(0, 0, LayoutFont(Typeface::Courier, LetterPoints), letter);
+    glyphs.addText(0, 0, Platform::LayoutFont(Platform::Typeface::Courier, LetterPoints), letter);
     const QPointF middle(TileSize / 2.0, TileSize / 2.0);
     QPainter painter(tile);
     painter.setRenderHint(QPainter::Antialiasing);
@@ -127,7 +129,8 @@ void PrintLetter(QPaintDevice* tile, const QString& letter) {
 
 }  // namespace
 
-QPixmap TilePicture(bool selected, const QString& letter, qreal pixelRatio, QColor background) {
+QPixmap MainWindow::TilePicture(bool selected, const QString& letter, qreal pixelRatio,
+                                QColor background) {
     static auto& pictures = *new QHash<QString, QPixmap>;  // outlives the application
     const QString key =
         QStringLiteral("%1/%2/%3/").arg(selected).arg(pixelRatio).arg(background.rgb()) + letter;

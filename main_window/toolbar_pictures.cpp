@@ -8,6 +8,8 @@
 
 namespace {
 
+using MainWindow::ToolbarPicture;
+
 // All pictures are drawn on a square of 16 units, edges on whole units where it
 // matters at 16 pixels.
 constexpr qreal Units = 16;
@@ -137,6 +139,6 @@ class PictureEngine : public QIconEngine {
 
 }  // namespace
 
-QIcon ToolbarIcon(ToolbarPicture picture, const QPalette& palette) {
+QIcon MainWindow::ToolbarIcon(ToolbarPicture picture, const QPalette& palette) {
     return QIcon(new PictureEngine(picture, ColoursFor(palette)));
 }

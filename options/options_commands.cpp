@@ -18,7 +18,7 @@
 namespace {
 
 QString TimeEntry(std::int16_t seconds) {
-    return QString::fromStdString(FormatTime(seconds));
+    return QString::fromStdString(Common::FormatTime(seconds));
 }
 
 QString SizeEntry(std::int32_t letters) {
@@ -80,7 +80,7 @@ void ApplyMaxWordSize(std::int16_t size) {
 namespace Common {
 
 void ShowOptions() {
-    WindowFront::Bring(Windows::Shared<OptionsDialog>());
+    Platform::BringToFront(Windows::Shared<OptionsDialog>());
 }
 
 void LoadOptions() {
@@ -108,7 +108,7 @@ void ApplyOptions() {
 }
 
 void CancelOptions() {
-    WindowFront::Hide(Windows::Shared<OptionsDialog>());
+    Platform::HideWindow(Windows::Shared<OptionsDialog>());
     Windows::Shared<Main>().update();
 }
 

@@ -14,6 +14,8 @@
 #include "platform/screen_reader.h"
 #include "platform/window_size.h"
 
+using namespace Platform;
+
 namespace {
 
 constexpr int ClientWidth = 402;
@@ -90,7 +92,7 @@ void OptionsDialog::makeBoxes() {
     WordSizeCombo = MakeBox(this, "WordSizeCombo", Pixels(144, 88, 137, 21),
                             "Largest word stored in dictionary and allowed in game");
     for (QComboBox* box : {MinWordSizeCombo, WordSizeCombo}) {
-        ScreenReader::TellValueOf(box, box->toolTip());
+        TellValueOf(box, box->toolTip());
     }
     SoundsOption = new QCheckBox(this);
     SetUp(SoundsOption, "SoundsOption", Pixels(144, 128, 17, 25), PlainFont());

@@ -4,6 +4,9 @@
 
 #include <algorithm>
 #include <charconv>
+#include <optional>
+#include <string>
+#include <string_view>
 
 #include "dictionary/dictionary.h"
 #include "platform/platform.h"
@@ -21,9 +24,18 @@ std::optional<std::string> ReadValue(const char* name) {
     return buffer.substr(0, static_cast<std::size_t>(length));
 }
 
+// None when the text is no whole number of 16 bits.
+std::optional<std::int16_t> ToNumber(std::string_view text) {
+    std::int16_t number = 0;
+    const char* end = text.data() + text.size();
+    const auto [stopped, error] = std::from_chars(text.data(), end, number);
+    if (error != std::errc() || stopped != end) return std::nullopt;
+    return number;
+}
+
 std::optional<std::int16_t> ReadNumber(const char* name) {
     const auto text = ReadValue(name);
-    return text ? Common::SettingNumber(*text) : std::nullopt;
+    return text ? ToNumber(*text) : std::nullopt;
 }
 
 void WriteValue(const char* name, const std::string& text) {
@@ -37,14 +49,6 @@ std::int16_t WordSizeOr(std::int16_t size, std::int16_t otherwise) {
 }  // namespace
 
 namespace Common {
-
-std::optional<std::int16_t> SettingNumber(std::string_view text) {
-    std::int16_t number = 0;
-    const char* end = text.data() + text.size();
-    const auto [stopped, error] = std::from_chars(text.data(), end, number);
-    if (error != std::errc() || stopped != end) return std::nullopt;
-    return number;
-}
 
 void LoadSettings() {
     if (const auto seconds = ReadNumber("TimeLimit")) {

@@ -1,9 +1,9 @@
-#include "platform/file_dialog.h"
+#include "platform/desktop.h"
 
 #include <QFileDialog>
 #include <QFileInfo>
 
-#include "platform/message_box.h"
+#include "platform/platform.h"
 #include "platform/window_front.h"
 
 namespace {
@@ -25,7 +25,7 @@ void SetUpDialog(QFileDialog& dialog, const std::string& folder) {
 QString Run(QFileDialog& dialog) {
     const bool accepted = dialog.exec() == QDialog::Accepted;
     dialog.hide();
-    WindowFront::GiveBack();
+    Platform::GiveFrontBack();
     const QStringList files = dialog.selectedFiles();
     return accepted && !files.isEmpty() ? files.first() : QString();
 }
@@ -36,17 +36,15 @@ std::string PathOf(const QString& file) {
 
 bool MayReplace(const QString& file) {
     if (!QFileInfo::exists(file)) return true;
-    return MessageBox::Ask(
+    return Platform::AskInMessageBox(
         QFileInfo(file).fileName().toStdString() + " already exists. Do you want to replace it?",
-        "Quorle");
+        Platform::ProgramTitle);
 }
 
 }  // namespace
 
-namespace FileDialog {
-
-std::string ChooseToOpen(const std::string& folder) {
-    QFileDialog dialog(WindowFront::Latest(), QFileDialog::tr("Open"));
+std::string Platform::ChooseInOpenDialog(const std::string& folder) {
+    QFileDialog dialog(LatestInFront(), QFileDialog::tr("Open"));
     SetUpDialog(dialog, folder);
     dialog.setFileMode(QFileDialog::ExistingFile);
     return PathOf(Run(dialog));
@@ -54,8 +52,8 @@ std::string ChooseToOpen(const std::string& folder) {
 
 // The suffix is added here, after the dialog has asked about the name as typed,
 // so that the name with its suffix is asked about as well.
-std::string ChooseToSave(const std::string& folder) {
-    QFileDialog dialog(WindowFront::Latest(), QFileDialog::tr("Save As"));
+std::string Platform::ChooseInSaveDialog(const std::string& folder) {
+    QFileDialog dialog(LatestInFront(), QFileDialog::tr("Save As"));
     SetUpDialog(dialog, folder);
     dialog.setAcceptMode(QFileDialog::AcceptSave);
     dialog.setFileMode(QFileDialog::AnyFile);
@@ -64,5 +62,3 @@ std::string ChooseToSave(const std::string& folder) {
     file += ".txt";
     return MayReplace(file) ? PathOf(file) : std::string();
 }
-
-}  // namespace FileDialog

@@ -13,7 +13,7 @@ constexpr int UsedAtStart = 512 * 1024;
 
 }  // namespace
 
-void PrepareHeap() {
+void Platform::PrepareHeap() {
     // Larger than what is freed below, or it would not stay with the heap.
     mallopt(M_MMAP_THRESHOLD, 2 * UsedAtStart);
     mallopt(M_TRIM_THRESHOLD, 2 * UsedAtStart);
@@ -24,6 +24,6 @@ void PrepareHeap() {
     std::free(heap);
 }
 
-void TrimHeap() {
+void Platform::TrimHeap() {
     malloc_trim(0);
 }

@@ -18,18 +18,18 @@ constexpr int PlainFontPixels = 11;
 constexpr int CellPadding = 8;
 constexpr const char* DefaultButtonProperty = "defaultButton";
 
-QFont FontOf(Typeface typeface, int pixels, bool bold) {
+QFont FontOf(Platform::Typeface typeface, int pixels, bool bold) {
     QFont font;
     // The Liberation fonts are as wide as Arial and Courier New, and part of every
     // installation: first, they make the windows the same everywhere.
     switch (typeface) {
-        case Typeface::SansSerif:
+        case Platform::Typeface::SansSerif:
             font.setFamilies({"Liberation Sans", "sans-serif"});
             break;
-        case Typeface::Arial:
+        case Platform::Typeface::Arial:
             font.setFamilies({"Liberation Sans", "Arial", "sans-serif"});
             break;
-        case Typeface::Courier:
+        case Platform::Typeface::Courier:
             font.setFamilies({"Liberation Mono", "Courier New", "monospace"});
             font.setStyleHint(QFont::TypeWriter);
             break;
@@ -62,6 +62,8 @@ class ReturnKeys : public QObject {
 };
 
 }  // namespace
+
+namespace Platform {
 
 QFont LayoutFont(Typeface typeface, double points, bool bold) {
     return FontOf(typeface, static_cast<int>(std::lround(points * PixelsPerPoint)), bold);
@@ -115,3 +117,5 @@ int RowTextWidth(const QAbstractScrollArea& list) {
     const int scrollBar = list.style()->pixelMetric(QStyle::PM_ScrollBarExtent);
     return list.width() - 2 * list.frameWidth() - scrollBar - CellPadding;
 }
+
+}  // namespace Platform

@@ -9,6 +9,8 @@ class QAbstractScrollArea;
 class QLabel;
 class QWidget;
 
+namespace Platform {
+
 constexpr int TwipsPerPixel = 15;
 
 /// Logical pixels of a length in twips, to the nearest.
@@ -59,3 +61,5 @@ void ShowFitting(QLabel& label, const QFont& font, const QString& text);
 
 /// The room for text in a list's or grid's row, beside its scroll bar.
 int RowTextWidth(const QAbstractScrollArea& list);
+
+}  // namespace Platform

@@ -41,6 +41,6 @@ class ArrowKeys : public QObject {
 
 }  // namespace
 
-void SelectByArrowKeys(QAbstractItemView* list) {
+void Platform::SelectByArrowKeys(QAbstractItemView* list) {
     list->installEventFilter(new ArrowKeys(list));
 }

@@ -4,7 +4,7 @@
 
 #include "platform/layout.h"
 
-QMenuBar* MakeMenuBar(QWidget* window) {
+QMenuBar* Platform::MakeMenuBar(QWidget* window) {
     auto* bar = new QMenuBar(window);
     bar->setObjectName("MenuBar");
     bar->setNativeMenuBar(false);
@@ -12,7 +12,7 @@ QMenuBar* MakeMenuBar(QWidget* window) {
     return bar;
 }
 
-void FillBelow(QMenuBar* bar, QWidget* client) {
+void Platform::FillBelow(QMenuBar* bar, QWidget* client) {
     auto* layout = new QVBoxLayout(bar->parentWidget());
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setMenuBar(bar);

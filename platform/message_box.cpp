@@ -1,4 +1,4 @@
-#include "platform/message_box.h"
+#include "platform/desktop.h"
 
 #include <QCloseEvent>
 #include <QKeyEvent>
@@ -25,27 +25,23 @@ template <class Box>
 QMessageBox::StandardButton Run(const std::string& text, const std::string& title,
                                 QMessageBox::StandardButtons buttons) {
     Box box(QMessageBox::NoIcon, QString::fromStdString(title), QString::fromStdString(text),
-            buttons, WindowFront::Latest());
+            buttons, Platform::LatestInFront());
     box.setTextFormat(Qt::PlainText);
     box.setWindowModality(Qt::ApplicationModal);
-    LetGrow(box);
+    Platform::LetGrow(box);
     box.exec();
     const auto pressed = box.standardButton(box.clickedButton());
     box.hide();
-    WindowFront::GiveBack();
+    Platform::GiveFrontBack();
     return pressed;
 }
 
 }  // namespace
 
-namespace MessageBox {
-
-void Show(const std::string& text, const std::string& title) {
+void Platform::ShowMessageBox(const std::string& text, const std::string& title) {
     Run<QMessageBox>(text, title, QMessageBox::Ok);
 }
 
-bool Ask(const std::string& text, const std::string& title) {
+bool Platform::AskInMessageBox(const std::string& text, const std::string& title) {
     return Run<Question>(text, title, QMessageBox::Yes | QMessageBox::No) == QMessageBox::Yes;
 }
-
-}  // namespace MessageBox

@@ -1,4 +1,4 @@
-#include "platform/program_folder.h"
+#include "platform/desktop.h"
 
 #include <quorle/word_engine.h>
 
@@ -53,7 +53,7 @@ void Furnish(const fs::path& folder, const fs::path& shared) {
 
 }  // namespace
 
-std::string FindProgramFolder() {
+std::string Platform::FindProgramFolder() {
     const fs::path own = ExecutableFolder();
     const fs::path shared = (own / "../share/quorle").lexically_normal();
     std::error_code error;

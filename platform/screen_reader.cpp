@@ -5,6 +5,7 @@
 #include <QPointer>
 #include <QTimer>
 
+#include "platform/desktop.h"
 #include "platform/platform.h"
 #include "platform/window_front.h"
 
@@ -64,14 +65,12 @@ void Announce(QWidget* window, const QString& text) {
 void TellAll() {
     const QString text = Untold;
     Untold.clear();
-    if (QWidget* window = WindowFront::Latest()) Announce(window, text);
+    if (QWidget* window = Platform::LatestInFront()) Announce(window, text);
 }
 
 }  // namespace
 
-namespace ScreenReader {
-
-void Tell(const std::string& text) {
+void Platform::TellScreenReader(const std::string& text) {
     if (!QAccessible::isActive()) return;
     if (Untold.isEmpty()) {
         QTimer::singleShot(0, TellAll);
@@ -81,17 +80,15 @@ void Tell(const std::string& text) {
     Untold += QString::fromStdString(text);
 }
 
-void TellValueOf(QComboBox* box, const QString& description) {
+void Platform::TellValueOf(QComboBox* box, const QString& description) {
 #if QT_VERSION >= QT_VERSION_CHECK(6, 8, 0)
     box->setAccessibleDescription(description);  // the toolkit tells the value itself
 #else
     const auto tell = [box, description](const QString& value) {
         box->setAccessibleDescription(value + ". " + description);
-        if (box->hasFocus() && !value.isEmpty()) Platform::Tell(value.toStdString());
+        if (box->hasFocus() && !value.isEmpty()) Tell(value.toStdString());
     };
     tell(box->currentText());
     QObject::connect(box, &QComboBox::currentTextChanged, box, tell);
 #endif
 }
-
-}  // namespace ScreenReader

@@ -1,17 +1,12 @@
 #pragma once
-// Speech through the player's screen reader, where one is active.
 #include <QString>
-#include <string>
 
 class QComboBox;
 
-namespace ScreenReader {
-
-/// Has a text said soon, wherever the focus is. What one event tells is said in one breath.
-void Tell(const std::string& text);
+namespace Platform {
 
 /// Has a box without typing say its value when it gets the focus and whenever the player
 /// changes it. `description` is said with it.
 void TellValueOf(QComboBox* box, const QString& description);
 
-}  // namespace ScreenReader
+}  // namespace Platform

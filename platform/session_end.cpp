@@ -39,7 +39,7 @@ void FollowSignals(const std::function<void()>& close) {
 
 }  // namespace
 
-void FollowSessionEnd(std::function<void()> close) {
+void Platform::FollowSessionEnd(std::function<void()> close) {
     FollowSignals(close);
     QObject::connect(qApp, &QGuiApplication::commitDataRequest, qApp,
                      [close = std::move(close)](QSessionManager& session) {

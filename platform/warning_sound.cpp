@@ -1,4 +1,4 @@
-#include "platform/warning_sound.h"
+#include "platform/desktop.h"
 
 #include <canberra.h>
 
@@ -98,11 +98,7 @@ class Player {
 
 }  // namespace
 
-namespace WarningSound {
-
-void Play() {
+void Platform::PlayWarningSound() {
     static auto* const player = new Player;
     player->request();
 }
-
-}  // namespace WarningSound

@@ -45,6 +45,6 @@ QAccessibleInterface* MakeInterface(const QString&, QObject* object) {
 
 }  // namespace
 
-void MakeWindowsAccessible() {
+void Platform::MakeWindowsAccessible() {
     QAccessible::installFactory(MakeInterface);
 }

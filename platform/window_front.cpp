@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <array>
 
+#include "platform/desktop.h"
 #include "platform/platform.h"
 
 namespace {
@@ -68,18 +69,18 @@ void SetShownBehind(QWidget& window, bool behind) {
 
 }  // namespace
 
-namespace WindowFront {
+namespace Platform {
 
-void Follow(QWidget* window) {
+void FollowWindow(QWidget* window) {
     static ActivationFilter filter;
     window->installEventFilter(&filter);
     Followed.removeAll(nullptr);
     Followed.append(window);
 }
 
-void Bring(QWidget& window) {
+void BringToFront(QWidget& window) {
     // A window shown anew is the only one that every compositor puts in front.
-    if (Platform::OnWayland() && InFront() != &window) window.hide();
+    if (OnWayland() && InFront() != &window) window.hide();
     window.setWindowState(window.windowState() & ~Qt::WindowMinimized);
     SetShownBehind(window, false);
     window.show();
@@ -87,16 +88,16 @@ void Bring(QWidget& window) {
     window.setAttribute(Qt::WA_KeyboardFocusChange);  // shows the focus before the first Tab
 }
 
-void Hide(QWidget& window) {
+void HideWindow(QWidget& window) {
     const bool wasInFront = window.isActiveWindow() || Asked == &window;
     window.hide();
     // Without a place of its own the window manager would choose another next time.
     if (QWindow* handle = window.windowHandle()) handle->setFramePosition(window.pos());
-    if (wasInFront) GiveBack();
+    if (wasInFront) GiveFrontBack();
 }
 
-void GiveBack() {
-    if (QWidget* window = Latest()) Ask(*window);
+void GiveFrontBack() {
+    if (QWidget* window = LatestInFront()) Ask(*window);
 }
 
 void ShowBehind(QWidget& window) {
@@ -110,7 +111,7 @@ void ShowBehind(QWidget& window) {
     }
 }
 
-bool IsOurs() {
+bool FrontIsOurs() {
     return InFront() != nullptr;
 }
 
@@ -118,7 +119,7 @@ bool DesktopTiles() {
     return qEnvironmentVariableIsSet("I3SOCK");
 }
 
-void Float(QWidget& window) {
+void FloatWindow(QWidget& window) {
     const auto main = std::find_if(Followed.begin(), Followed.end(), [](const auto& followed) {
         return followed != nullptr && NumberOf(followed) == 1;
     });
@@ -128,12 +129,12 @@ void Float(QWidget& window) {
     window.windowHandle()->setTransientParent((*main)->windowHandle());
 }
 
-QWidget* Latest() {
+QWidget* LatestInFront() {
     const auto found = std::find_if(Followed.begin(), Followed.end(), CanBeInFront);
     return found == Followed.end() ? nullptr : found->data();
 }
 
-std::int32_t Number() {
+std::int32_t NumberInFront() {
     const QWidget* active = QApplication::activeWindow();
     if (active == nullptr) return 0;
     if (const std::int32_t number = NumberOf(active)) return number;
@@ -141,4 +142,4 @@ std::int32_t Number() {
     return owner == nullptr ? 0 : -NumberOf(owner->window());
 }
 
-}  // namespace WindowFront
+}  // namespace Platform

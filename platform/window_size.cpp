@@ -12,7 +12,7 @@ namespace {
 
 // A tiling compositor maximises nothing, and floats a window by its only size.
 bool MayBeMaximised() {
-    return Platform::OnWayland() && !WindowFront::DesktopTiles();
+    return Platform::OnWayland() && !Platform::DesktopTiles();
 }
 
 class SizeFilter : public QObject {
@@ -32,6 +32,8 @@ class SizeFilter : public QObject {
 
 }  // namespace
 
+namespace Platform {
+
 void SetOnlySize(QWidget& window, QSize size) {
     window.setMinimumSize(size);
     window.resize(size);
@@ -47,3 +49,5 @@ void LetGrow(QWidget& window) {
     static SizeFilter filter;
     window.installEventFilter(&filter);
 }
+
+}  // namespace Platform

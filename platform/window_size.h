@@ -6,6 +6,8 @@
 class QLayout;
 class QWidget;
 
+namespace Platform {
+
 /// Gives a window its only size. Where it can be maximised all the same it grows,
 /// and its contents stay as they are.
 void SetOnlySize(QWidget& window, QSize size);
@@ -15,3 +17,5 @@ void SetOnlySize(QLayout& layout);
 
 /// The same for a window that settles its own only size, and again with its layout.
 void LetGrow(QWidget& window);
+
+}  // namespace Platform

@@ -20,6 +20,8 @@
 #include "state/game_state.h"
 #include "state/windows.h"
 
+using namespace GameResults;
+
 namespace {
 
 // One letter a cube in board order, the Qu cube as "q".
@@ -92,15 +94,9 @@ void EndGame(const char* why) {
     results.ResultsOK->setAccessibleDescription(why + (". " + SummaryText()));
     results.ResultsOK->setFocus();
     Dictionary::ShowWaitingEditor();
-    WindowFront::Float(results);
-    WindowFront::Bring(results);
+    Platform::FloatWindow(results);
+    Platform::BringToFront(results);
     UpdateResultLabels();
-}
-
-QString SummaryText() {
-    const Results& results = Windows::Shared<Results>();
-    return results.WordsLabel->text() + ". " + results.ScoreLabel->text() + ". " +
-           results.BadWordsLabel->text();
 }
 
 void UpdateResultLabels() {
@@ -115,3 +111,9 @@ void UpdateResultLabels() {
 }
 
 }  // namespace Common
+
+QString GameResults::SummaryText() {
+    const Results& results = Windows::Shared<Results>();
+    return results.WordsLabel->text() + ". " + results.ScoreLabel->text() + ". " +
+           results.BadWordsLabel->text();
+}

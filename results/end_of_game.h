@@ -11,10 +11,14 @@ void SolveBoard();
 /// an earlier game stays. A screen reader says why before it reads the results.
 void EndGame(const char* why);
 
-/// The three summary lines in one.
-QString SummaryText();
-
 /// Rewrites the three summary lines from the three lists.
 void UpdateResultLabels();
 
 }  // namespace Common
+
+namespace GameResults {
+
+/// The three summary lines in one.
+QString SummaryText();
+
+}  // namespace GameResults

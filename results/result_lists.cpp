@@ -14,9 +14,11 @@ const QColor LitColour(128, 255, 128);
 
 }  // namespace
 
+namespace GameResults {
+
 void AddWord(QListWidget& list, const QString& word) {
     auto* item = new QListWidgetItem(word);
-    const QFont fitting = Condensed(list.font(), word, RowTextWidth(list));
+    const QFont fitting = Platform::Condensed(list.font(), word, Platform::RowTextWidth(list));
     if (fitting != list.font()) item->setFont(fitting);
     if (fitting.strikeOut()) item->setData(Qt::AccessibleDescriptionRole, "not in dictionary");
     list.addItem(item);
@@ -59,10 +61,10 @@ int IndexOf(const QListWidget& list, const QString& word) {
     return -1;
 }
 
-Common::Tally TallyOf(const QListWidget& list) {
-    Common::Tally tally;
+Tally TallyOf(const QListWidget& list) {
+    Tally tally;
     for (int i = 0; i < list.count(); ++i) {
-        Common::Count(tally, list.item(i)->text().toStdString());
+        Count(tally, list.item(i)->text().toStdString());
     }
     return tally;
 }
@@ -76,3 +78,5 @@ void LightResultCube(QLabel& cube, std::size_t k, bool lit) {
     const QString place = QString("Row %1, column %2").arg(k / 4 + 1).arg(k % 4 + 1);
     cube.setAccessibleDescription(lit ? place + ", lit" : place);
 }
+
+}  // namespace GameResults

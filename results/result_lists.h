@@ -7,6 +7,8 @@
 class QLabel;
 class QListWidget;
 
+namespace GameResults {
+
 /// Adds a word in its alphabetical place.
 void AddWord(QListWidget& list, const QString& word);
 
@@ -25,8 +27,10 @@ void DescribePlaces(QListWidget& list);
 int IndexOf(const QListWidget& list, const QString& word);
 
 /// Words and points of a list.
-Common::Tally TallyOf(const QListWidget& list);
+Tally TallyOf(const QListWidget& list);
 
 /// Gives cube `k` (0..15) of the small board its lit or its plain colour, and its
 /// property `selected`; its accessible description tells place and look.
 void LightResultCube(QLabel& cube, std::size_t k, bool lit);
+
+}  // namespace GameResults

@@ -16,6 +16,8 @@
 #include "state/game_state.h"
 #include "state/windows.h"
 
+using namespace GameResults;
+
 namespace {
 
 constexpr double ShortestShowing = 2;  // seconds
@@ -32,7 +34,7 @@ void AddWhereEntered(QListWidget& userWords, const QTableWidget& entered, const 
 }
 
 void TellCorrection(const QString& word, const char* what) {
-    Platform::Tell(QString("%1 %2. %3").arg(word, what, Common::SummaryText()).toStdString());
+    Platform::Tell(QString("%1 %2. %3").arg(word, what, SummaryText()).toStdString());
 }
 
 }  // namespace
@@ -87,7 +89,7 @@ void RejectDictWord() {
 void CloseResults() {
     if (Platform::SteadySeconds() - State.ResultsShownAt <= ShortestShowing) return;
     Results& results = Windows::Shared<Results>();
-    WindowFront::Hide(results);
+    Platform::HideWindow(results);
     for (QListWidget* list : {results.UserWords, results.BadWords, results.DictWords}) {
         const QSignalBlocker quiet(list);
         list->clear();

@@ -15,6 +15,9 @@
 #include "results/results_commands.h"
 #include "state/windows.h"
 
+using namespace GameResults;
+using namespace Platform;
+
 namespace {
 
 constexpr int ClientWidth = 632;
@@ -183,7 +186,7 @@ void Results::placeBeside(const QWidget& window) {
 // makes it anew.
 void Results::closeEvent(QCloseEvent* event) {
     event->accept();
-    WindowFront::Hide(*this);
+    HideWindow(*this);
     Windows::Discard<Results>();
 }
 

@@ -18,21 +18,21 @@ std::string OutOf(std::int16_t part, std::int16_t whole) {
 
 }  // namespace
 
-namespace Common {
-
-std::int16_t WordPoints(std::string_view word) {
+std::int16_t Common::WordPoints(std::string_view word) {
     constexpr std::size_t Shortest = 4;
     constexpr std::array<std::int16_t, 5> Points{1, 2, 3, 5, 11};  // of 4, 5, 6, 7, 8 letters
     const std::size_t length = std::clamp<std::size_t>(word.size(), Shortest, 8);
     return Points[length - Shortest];
 }
 
+namespace GameResults {
+
 void Count(Tally& tally, std::string_view word) {
     const auto add = [](std::int16_t sum, std::int16_t more) {
         return static_cast<std::int16_t>(std::min(sum + more, INT16_MAX));
     };
     tally.words = add(tally.words, 1);
-    tally.points = add(tally.points, WordPoints(word));
+    tally.points = add(tally.points, Common::WordPoints(word));
 }
 
 std::string WordsLine(const Tally& player, const Tally& computer) {
@@ -47,4 +47,4 @@ std::string BadWordsLine(std::int16_t words) {
     return CountedWords(words) + " not in dictionary";
 }
 
-}  // namespace Common
+}  // namespace GameResults

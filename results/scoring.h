@@ -9,6 +9,10 @@ namespace Common {
 /// 1, 2, 3, 5 or 11 points, by the word's length; "qu" counts two letters.
 std::int16_t WordPoints(std::string_view word);
 
+}  // namespace Common
+
+namespace GameResults {
+
 /// The number of words in a list and the sum of their points, 32767 at most.
 struct Tally {
     std::int16_t words = 0;
@@ -27,4 +31,4 @@ std::string ScoreLine(const Tally& player, const Tally& computer);
 /// "1 word not in dictionary".
 std::string BadWordsLine(std::int16_t words);
 
-}  // namespace Common
+}  // namespace GameResults

@@ -17,7 +17,7 @@ Window& Shared() {
     if (Existing<Window> == nullptr) {
         auto* window = new Window;
         Existing<Window> = window;
-        WindowFront::Follow(window);
+        Platform::FollowWindow(window);
         if constexpr (requires { window->load(); }) window->load();
     }
     return *Existing<Window>;

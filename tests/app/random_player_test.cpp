@@ -244,14 +244,14 @@ class WildPlayer : public PlayedBoard {
     }
     void checkResults() {
         const auto tally = [this](const char* list) {
-            Common::Tally all;
-            for (const std::string& word : sorted(list)) Common::Count(all, word);
+            GameResults::Tally all;
+            for (const std::string& word : sorted(list)) GameResults::Count(all, word);
             return all;
         };
         const auto user = tally("UserWords"), dictionary = tally("DictWords");
-        EXPECT_EQ(summary(), Common::WordsLine(user, dictionary) + "; " +
-                                 Common::ScoreLine(user, dictionary) + "; " +
-                                 Common::BadWordsLine(tally("BadWords").words));
+        EXPECT_EQ(summary(), GameResults::WordsLine(user, dictionary) + "; " +
+                                 GameResults::ScoreLine(user, dictionary) + "; " +
+                                 GameResults::BadWordsLine(tally("BadWords").words));
     }
     Words sorted(const std::string& list) {
         const Words listed = words(list);

@@ -111,7 +111,7 @@ TEST_F(StartAndExit, AChangeIsSavedOrDropped) {
 TEST_F(StartAndExit, ASessionThatEndsAsksOnceAndBelowAnOpenBoxNotAtAll) {
     makeDictionary({"cat"});
     launch();
-    FollowSessionEnd([this] { control("Main")->close(); });
+    Platform::FollowSessionEnd([this] { control("Main")->close(); });
     const auto endSession = [] {
         emit qApp->commitDataRequest(*qApp->findChild<QSessionManager*>());
     };

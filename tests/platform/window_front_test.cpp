@@ -26,9 +26,9 @@ TEST_F(Fronts, AFrontThatWasOnlyAskedForIsGivenBackToo) {
     elsewhere.activateWindow();
     ASSERT_TRUE(QTest::qWaitForWindowActive(&elsewhere));
     const QSignalBlocker unanswered(control("OptionsDialog")->windowHandle());
-    WindowFront::GiveBack();
+    Platform::GiveFrontBack();
     elsewhere.hide();
-    WindowFront::Hide(*control("OptionsDialog"));
+    Platform::HideWindow(*control("OptionsDialog"));
     EXPECT_TRUE(comesToFront("Main"));
 }
 

@@ -5,12 +5,12 @@
 
 namespace {
 
-using namespace Common;
+using namespace GameResults;
 
 TEST(Scoring, PointsGoByLengthAndLinesRoundDown) {
     const std::array<int, 12> points{1, 1, 1, 1, 1, 2, 3, 5, 11, 11, 11, 11};
     for (std::size_t length = 0; length < points.size(); ++length) {
-        EXPECT_EQ(WordPoints(std::string(length, 'a')), points[length]) << length;
+        EXPECT_EQ(Common::WordPoints(std::string(length, 'a')), points[length]) << length;
     }
     EXPECT_EQ(WordsLine({3, 0}, {7, 0}), "3 words found out of 7 (42%)");
     EXPECT_EQ(WordsLine({1, 1}, {0, 0}), "1 word found");

@@ -38,7 +38,7 @@ ProgramFixture::~ProgramFixture() {
 }
 
 void ProgramFixture::endProgram() {
-    Common::DestroyWindows();
+    App::DestroyWindows();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 }
 
@@ -51,7 +51,7 @@ void ProgramFixture::relaunch() {
 void ProgramFixture::launch() {
     Platform::UseDesktop();
     useTestDesktop();
-    Main& window = Common::LoadMainWindow();
+    Main& window = App::LoadMainWindow();
     EXPECT_EQ(clock().interval(), 1000);
     clock().setInterval(3'600'000);
     window.show();
