@@ -42,29 +42,10 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
     Random random_;
 };
 
+// First boards of few letters and words that are everywhere on them: more chains than are ever
+// followed twice. The limits leave words that are never found, the dead end is a word that does
+// not fit.
 TEST_P(BoardSearchTest, FindsWhatTryingEveryWordFinds) {
-    constexpr std::string_view Letters = "uaqeistrnlodcm";
-    for (std::size_t few = 3; few <= Letters.size(); ++few) {
-        const auto letters = Letters.substr(0, few);
-        const auto word = [&] { return Text(random_, 2 + random_() % 5, letters); };
-        const auto limit = [&](unsigned n) { return 2 + static_cast<int>(random_() % n); };
-        words_ = {};
-        graph_ = {};
-        for (const char* qu : {"suq", "quit", "iraq", "qq", "qi", "quq", "uqu"}) edit(qu);
-        for (int i = 0; i < 2000; ++i) edit(word());
-        graph_ = CopyGraph(graph_, 16);
-        for (int board = 0; board < 100; ++board) {
-            std::string cubes = Text(random_, 16, letters);
-            if (board % 2 == 0) std::replace(cubes.begin(), cubes.end(), 'q', 'a');
-            search(cubes, {limit(3), limit(15)});
-            for (int i = 0; i < 20; ++i) edit(word());
-        }
-    }
-}
-
-// Boards of few letters and words that are everywhere on them: more chains than are ever followed
-// twice. The limits leave words that are never found, the dead end is a word that does not fit.
-TEST_P(BoardSearchTest, HardBoards) {
     for (std::size_t size = 2; size <= 16; ++size) edit(std::string(size, 'a'));
     for (const char* deadEnd : {"aaaaaaaaaaaaab", "aaaaaaaaaaaaaaab"}) edit(deadEnd);
     for (int i = 0; i < 500; ++i) edit(Text(random_, 8 + random_() % 2, "ab"));
@@ -72,6 +53,15 @@ TEST_P(BoardSearchTest, HardBoards) {
     for (const char* board : {"aaaaaaaaaaaaaaaa", "aaaaaaaaaaaaaaab", "abababbaababbaab"}) {
         search(board, {3, 16});
         search(board, {2, 9});
+    }
+    for (const char* qu : {"suq", "quit", "iraq", "qq", "qi", "quq", "uqu"}) edit(qu);
+    for (std::size_t board = 0; board < 1000; ++board) {
+        const auto letters = std::string_view("uaqeistrnlodcm").substr(0, 3 + board / 80);
+        for (int i = 0; i < 40; ++i) edit(Text(random_, 2 + random_() % 5, letters));
+        const int shortest = 2 + static_cast<int>(random_() % 3);
+        const int longest = 2 + static_cast<int>(random_() % 15);
+        search(Text(random_, 16, letters), {shortest, longest});
+        if (board % 100 == 0) graph_ = CopyGraph(graph_, 16);
     }
 }
 

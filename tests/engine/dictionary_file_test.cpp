@@ -26,30 +26,9 @@ class DictionaryFile : public testing::Test {
     TempFolder folder_;
 };
 
-TEST_F(DictionaryFile, IsMinimalAndAnyDamageToItIsRefused) {
-    Random random;
-    for (int i = 0; i < 60; ++i) cDictionaryAdd(Text(random, 2 + random() % 5, "uaqei").c_str());
-    const std::string whole = saved();
-    const WordSet words = AllWords();
-    ASSERT_EQ(cWriteTextFile((folder_ / "words").c_str()), 1);
-    cDictionaryClear();
-    Finish(cReadTextFile((folder_ / "words").c_str()));
-    EXPECT_EQ(saved(), whole);  // built at once as word by word
-    for (std::size_t i = 0; i < whole.size(); ++i) {
-        EXPECT_FALSE(load(whole.substr(0, i))) << i;
-        for (int bit = 0; bit < 8; ++bit) {
-            std::string damaged = whole;
-            damaged[i] = static_cast<char>(damaged[i] ^ 1 << bit);
-            EXPECT_FALSE(load(damaged)) << "byte " << i << " bit " << bit;
-        }
-    }
-    EXPECT_EQ(AllWords(), words);
-    EXPECT_TRUE(load(whole));
-}
-
 // A file that the first version wrote, byte by byte: it is read, and written the same. Whatever a
-// byte is changed to, the checksum with it, is refused or makes a sound dictionary.
-TEST_F(DictionaryFile, KeepsItsFormAndIsSafeWhereTheChecksumIsRight) {
+// byte is changed to is refused; with the checksum changed, too, it may be a sound dictionary.
+TEST_F(DictionaryFile, KeepsItsFormAndAnyDamageToItDoesNone) {
     constexpr std::size_t MaxWordSizeAt = 10, NodesAt = 32;
     const std::string old =
         "Qurd\xea\x8c\x6f\x3a\1\0\20\0\5\0\0\0\6\0\0\0\10\0\0\0\1\0\0\0\5\0\1\0"  // header
@@ -62,19 +41,21 @@ TEST_F(DictionaryFile, KeepsItsFormAndIsSafeWhereTheChecksumIsRight) {
     EXPECT_EQ(saved(), old);
     int loaded = 0;
     for (std::size_t at = 0; at < old.size(); ++at) {
+        EXPECT_FALSE(load(old.substr(0, at)) || load(Sealed(old.substr(0, at)))) << at;
         for (int byte = 0; byte < 256; ++byte) {
             std::string changed = old;
             changed[at] = static_cast<char>(byte);
-            if (changed == old || !load(Sealed(changed))) continue;
             SCOPED_TRACE("byte " + std::to_string(at) + " is " + std::to_string(byte));
-            EXPECT_TRUE(at == MaxWordSizeAt || at >= NodesAt || Sealed(changed) == old);
+            EXPECT_EQ(load(changed), changed == old);
+            if (Sealed(changed) == old || !load(Sealed(changed))) continue;
+            EXPECT_TRUE(at == MaxWordSizeAt || at >= NodesAt);
             EXPECT_TRUE(cMaxWordSize() >= 2 && cMaxWordSize() <= 16);
             EXPECT_NO_THROW(AllWords());
             ++loaded;
         }
     }
     std::cout << loaded << " changed files were sound\n";
-    EXPECT_GT(loaded, 100);
+    EXPECT_GT(loaded, 50);
 }
 
 // Every node shared by the one above, 26 times or once: too many words, or too long ones. The

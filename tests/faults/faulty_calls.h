@@ -1,6 +1,7 @@
 #pragma once
 // System calls that fail when told to. Linked ahead of the C library, the functions of this unit
 // are what every other part of the program calls.
+#include <functional>
 #include <map>
 #include <string>
 
@@ -16,10 +17,7 @@ struct Plan {
     bool noLinks = false;
 };
 
-/// Counts calls, and carries out the plan, from now on.
-void Arm(const Plan& plan);
-
-/// Ends that; returns how often each function was called.
-std::map<std::string, int> Disarm();
+/// Carries out the plan while `work` runs; returns how often each function was called.
+std::map<std::string, int> During(const Plan& plan, const std::function<void()>& work);
 
 }  // namespace FaultyCalls

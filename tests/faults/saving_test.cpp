@@ -1,24 +1,22 @@
 // Every system call of a save fails, is cut short or is the process's last, one at a time.
 #include <gtest/gtest.h>
+#include <quorle/word_engine.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cstring>
 #include <iostream>
 
+#include "engine/temp_folder.h"
 #include "faulty_calls.h"
-#include "quorle/word_engine.h"
-#include "tests/engine/temp_folder.h"
 
 namespace {
 
 using FaultyCalls::Fault;
 using FaultyCalls::Plan;
 using Names = std::set<std::string>;
-
-constexpr const char* Old = "old words, none of them a dictionary";
-const Names Links{"link", "settings", "quorle"};  // all of them to "target" and its folder
 
 std::int32_t SaveSetting(const char*) {
     return cSetRegValue("key", "name", "value", 5);
@@ -53,127 +51,112 @@ class Saving : public testing::TestWithParam<Scenario> {
     Saving() {
         cDictionaryClear();
         for (const char* word : {"cat", "cats", "zebra"}) cDictionaryAdd(word);
-        const TempFolder folder;
-        prepare(folder);
-        EXPECT_TRUE(save(folder));
-        new_ = folder.read("target");
-        EXPECT_NE(new_, old());
+        prepare();
+        EXPECT_TRUE(save());
+        new_ = folder_->read("target");
     }
     /// Saves under the plan, checks what is there afterwards and returns the calls that were made.
-    std::map<std::string, int> saveWith(const Plan& plan) const;
+    std::map<std::string, int> saveWith(const Plan& plan);
     /// Kills the save there, again and again; the next save then cleans up.
-    void killAt(const Plan& plan) const;
+    void killAt(const Plan& plan);
 
   private:
-    std::string old() const { return GetParam().exists ? Old : ""; }
-    bool save(const TempFolder& folder) const {
-        return GetParam().save((folder / GetParam().path).c_str()) == 1;
-    }
-    bool saved(const TempFolder& folder) const { return folder.read("target") == new_; }
-    void prepare(const TempFolder& folder) const;
-    void check(const TempFolder& folder, const Plan& plan) const;
+    bool save() const { return GetParam().save((*folder_ / GetParam().path).c_str()) == 1; }
+    bool saved() const { return folder_->read("target") == new_; }
+    void prepare();
+    void check(const Plan& plan) const;
 
+    const std::string old_ = GetParam().exists ? "old words, none of them a dictionary" : "";
     std::string new_;
+    std::optional<TempFolder> folder_;
 };
 
-void Saving::prepare(const TempFolder& folder) const {
-    setenv("XDG_CONFIG_HOME", folder.path().c_str(), 1);
-    for (const char* link : {"link", "settings"}) {
-        std::filesystem::create_symlink("target", folder / link);
-    }
-    std::filesystem::create_symlink(".", folder / "quorle");
+void Saving::prepare() {
+    folder_.emplace();
+    setenv("XDG_CONFIG_HOME", folder_->path().c_str(), 1);
+    std::filesystem::create_symlink("target", *folder_ / "link");
+    std::filesystem::create_symlink("target", *folder_ / "settings");
+    std::filesystem::create_symlink(".", *folder_ / "quorle");
     if (!GetParam().exists) return;
-    folder.write("target", Old);
-    const std::string target = folder / "target";
+    const std::string target = folder_->write("target", old_);
     EXPECT_TRUE(getuid() != 0 || chown(target.c_str(), 1234, 1234) == 0);
     ASSERT_EQ(chmod(target.c_str(), 0604), 0);
     if (GetParam().damaged) cReadBinaryDictionary(target.c_str());
 }
 
 /// The old content or the new, and nothing beside it; a damaged file is kept exactly by a save.
-void Saving::check(const TempFolder& folder, const Plan& plan) const {
-    EXPECT_TRUE(saved(folder) || folder.read("target") == old());
-    Names expected = Links;
-    if (GetParam().exists || saved(folder)) expected.insert("target");
-    if (GetParam().damaged && saved(folder)) {
-        expected.insert("target.damaged");
-        EXPECT_EQ(folder.read("target.damaged"), Old);
-    }
-    EXPECT_EQ(folder.names(), expected);
-    for (const auto& link : Links) EXPECT_TRUE(std::filesystem::is_symlink(folder / link));
+void Saving::check(const Plan& plan) const {
+    EXPECT_TRUE(saved() || folder_->read("target") == old_);
+    Names expected{"link", "settings", "quorle"};
+    for (const auto& link : expected) EXPECT_TRUE(std::filesystem::is_symlink(*folder_ / link));
+    if (GetParam().exists || saved()) expected.insert("target");
+    if (GetParam().damaged && saved()) expected.insert("target.damaged");
+    EXPECT_EQ(folder_->names(), expected);
+    EXPECT_EQ(folder_->read("target.damaged"), expected.count("target.damaged") == 1 ? old_ : "");
     // Without links a save that is killed leaves the old file under its second name alone.
     const bool moved = GetParam().noLinks && plan.fault == Fault::Kill;
     if (!GetParam().exists || moved) return;
     struct stat status {};
-    ASSERT_EQ(stat((folder / "target").c_str(), &status), 0);
+    ASSERT_EQ(stat((*folder_ / "target").c_str(), &status), 0);
     EXPECT_EQ(status.st_mode & mode_t{07777}, 0604U);
     EXPECT_TRUE(getuid() != 0 || status.st_uid == 1234 || plan.call == "fchown");
 }
 
-std::map<std::string, int> Saving::saveWith(const Plan& plan) const {
-    const TempFolder folder;
-    prepare(folder);
+std::map<std::string, int> Saving::saveWith(const Plan& plan) {
+    prepare();
     const int before = OpenFiles();
-    FaultyCalls::Arm(plan);
-    const bool done = save(folder);
-    const auto calls = FaultyCalls::Disarm();
+    bool done = false;
+    const auto calls = FaultyCalls::During(plan, [&] { done = save(); });
     EXPECT_EQ(OpenFiles(), before);
-    check(folder, plan);
+    check(plan);
     // When the folder's sync has failed only whether the new content is on the disk is not known.
     const bool folderSync = plan.call == "fsync" && calls.count("renameat") == 1;
-    EXPECT_EQ(done || folderSync, saved(folder));
+    EXPECT_EQ(done || folderSync, saved());
     const Names fatal{"write", "fsync", "renameat", "fchmod"};
     const Names repeated{"openat", "read", "write", "fsync", "flock", "close"};
     if (plan.fault != Fault::Error || (plan.error == EINTR && repeated.count(plan.call) == 1)) {
         EXPECT_TRUE(done);
-    } else if (fatal.count(plan.call) == 1) {
-        EXPECT_FALSE(done);
+    } else {
+        EXPECT_FALSE(done && fatal.count(plan.call) == 1);
     }
     return calls;
 }
 
-void Saving::killAt(const Plan& plan) const {
-    const TempFolder folder;
-    prepare(folder);
-    for (int kill = 0; kill < 2 && !saved(folder); ++kill) {
+void Saving::killAt(const Plan& plan) {
+    prepare();
+    for (int kill = 0; kill < 2 && !saved(); ++kill) {
         if (fork() == 0) {
-            FaultyCalls::Arm(plan);
-            save(folder);
+            FaultyCalls::During(plan, [this] { save(); });
             _exit(0);
         }
         int status = 0;
         wait(&status);
         EXPECT_TRUE(WIFSIGNALED(status) || kill > 0);
     }
-    Names left = folder.names();
-    for (const auto& own : Links) left.erase(own);
-    for (const char* own : {"target", "target.damaged"}) left.erase(own);
-    EXPECT_TRUE(left.empty() || left == Names{".quorle-save"});
-    if (!saved(folder)) {
-        FaultyCalls::Arm({Fault::None, "", 0, 0, GetParam().noLinks});
-        EXPECT_TRUE(save(folder));
-        FaultyCalls::Disarm();
-    }
-    check(folder, plan);
+    const Names ours{".quorle-save", "link", "quorle", "settings", "target", "target.damaged"};
+    EXPECT_TRUE(std::ranges::includes(ours, folder_->names()));
+    Plan again = plan;
+    again.fault = Fault::None;
+    if (!saved()) FaultyCalls::During(again, [this] { EXPECT_TRUE(save()); });
+    check(plan);
 }
 
 TEST_P(Saving, SurvivesEveryFault) {
-    Plan plan{Fault::None, "", 0, 0, GetParam().noLinks};
+    Plan plan;
+    plan.noLinks = GetParam().noLinks;
     int faults = 0;
     for (const auto& [call, times] : saveWith(plan)) {
-        plan.call = call;
-        for (plan.number = 1; plan.number <= times; ++plan.number) {
-            SCOPED_TRACE(call + " number " + std::to_string(plan.number));
-            plan.fault = Fault::Error;
+        for (int number = 1; number <= times; ++number) {
+            SCOPED_TRACE(call + " number " + std::to_string(number));
+            plan = {Fault::Error, call, number, 0, plan.noLinks};
             for (const int error : {ENOSPC, EIO, EDQUOT, EACCES, EINTR}) {
-                SCOPED_TRACE(strerror(error));
-                plan.error = error;
+                SCOPED_TRACE(strerror(plan.error = error));
                 saveWith(plan);
             }
             plan.fault = Fault::Kill;
             killAt(plan);
-            plan.fault = Fault::Short;  // only reading and writing can be
-            saveWith(plan);
+            plan.fault = Fault::Short;
+            if (call == "read" || call == "write") saveWith(plan);
             faults += call == "read" || call == "write" ? 7 : 6;
         }
     }
