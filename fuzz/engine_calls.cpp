@@ -1,17 +1,16 @@
 // Any sequence of engine calls with any arguments and files, against a plain set of words.
 #include <algorithm>
 
-#include "engine/sealed.h"
+#include "engine/calls.h"
 #include "engine/temp_folder.h"
-#include "engine/words.h"
 #include "support/chains.h"
 
 namespace {
 
 const std::uint8_t* At;
 const std::uint8_t* End;
-WordSet Held, Saved;
-std::int32_t Min, Max, SavedMax;
+WordSet Held;
+std::int32_t Min, Max;
 
 const TempFolder& Folder() {
     setenv("TMPDIR", "/dev/shm", 0);  // in memory, if the fuzzing is to be quick
@@ -76,17 +75,9 @@ void ChangeLimits() {
     std::erase_if(Held, [](auto& each) { return static_cast<int>(each.size()) > Max; });
 }
 
-void Save() {
+std::string Saved() {
     REQUIRE(cWriteBinaryDictionary((Folder() / "Dictionary.dat").c_str()) == 1);
-    Saved = Held;
-    SavedMax = Max;
-}
-
-void Load() {
-    REQUIRE(cReadBinaryDictionary(Word().c_str()) == 0);
-    REQUIRE(cReadBinaryDictionary((Folder() / "Dictionary.dat").c_str()) == 1);
-    Held = Saved;
-    Max = SavedMax;
+    return Folder().read("Dictionary.dat");
 }
 
 /// Any bytes, the checksum made right: refused, or a dictionary that works.
@@ -111,21 +102,13 @@ void MergeAnything() {
     }
 }
 
-std::string Setting(const char* name) {
-    std::string value(255, '?');
-    std::int32_t length = 255;
-    const std::int32_t present = cGetRegValue("key", name, value.data(), &length);
-    REQUIRE(length >= 0 && length <= 255 && (present == 1 || length == 0));
-    return value.substr(0, static_cast<std::size_t>(length)) + (present == 1 ? "" : "absent");
-}
-
 /// Values are read or absent, and storing one keeps the others.
 void ReadAnySettings() {
     Folder().write("quorle/settings", Bytes());
-    Setting("name");
-    const std::string other = Setting("other");
+    Setting("key", "name");
+    const std::string other = Setting("key", "other");
     REQUIRE(cSetRegValue("key", "name", "stored", 6) == 1);
-    REQUIRE(Setting("name") == "stored" && Setting("other") == other);
+    REQUIRE(Setting("key", "name") == "stored" && Setting("key", "other") == other);
 }
 
 /// What lies on the board is found. Later changes reach neither the results nor a listing.
@@ -165,16 +148,28 @@ void Nonsense() {
     REQUIRE(cSetRegValue("k", "n", "text", -1 - Number()) == 0);
 }
 
-/// What was edited is saved as what is built at once.
+/// What is saved is loaded again, whatever comes between.
+void SaveAndLoad() {
+    const std::int32_t max = Max;
+    const WordSet held = Held;
+    Saved();
+    Add(Word());
+    Remove();
+    ChangeLimits();
+    REQUIRE(cReadBinaryDictionary(Word().c_str()) == 0);
+    REQUIRE(cReadBinaryDictionary((Folder() / "Dictionary.dat").c_str()) == 1);
+    Held = held;
+    Max = max;
+}
+
+/// The engine holds what it should, and saves it as if it were built at once.
 void Check() {
     REQUIRE(AllWords() == Held && cMinWordSize() == Min && cMaxWordSize() == Max);
-    cSetMaxWordSize(16);
-    Save();
-    const std::string edited = Folder().read("Dictionary.dat"), words = Folder() / "words";
+    cSetMaxWordSize(Max = 16);
+    const std::string edited = Saved(), words = Folder() / "words";
     REQUIRE(cWriteTextFile(words.c_str()) == 1 && cDictionaryClear() == 1);
     Finish(Step(0, words.c_str()));
-    Save();
-    REQUIRE(Folder().read("Dictionary.dat") == edited);
+    REQUIRE(Saved() == edited);
 }
 
 }  // namespace
@@ -187,11 +182,10 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     cSetMinWordSize(Min = 3);
     cSetMaxWordSize(Max = 16);
     Held.clear();
-    Save();
     using Call = void (*)();
     constexpr Call Add3 = [] { Add(Word()), Add(Word()), Add(Word()); };
-    constexpr Call Calls[] = {Add3, Remove,       LookUp,        ChangeLimits,    Save,   Load,
-                              Add3, LoadAnything, MergeAnything, ReadAnySettings, Search, Nonsense};
+    constexpr Call Calls[] = {Add3,          Remove,          LookUp, ChangeLimits, LoadAnything,
+                              MergeAnything, ReadAnySettings, Search, SaveAndLoad,  Nonsense};
     while (At != End) Calls[static_cast<std::size_t>(Number()) % std::size(Calls)]();
     Check();
     return 0;

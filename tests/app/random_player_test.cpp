@@ -10,7 +10,7 @@
 #include <iostream>
 #include <set>
 
-#include "engine/words.h"
+#include "engine/calls.h"
 #include "platform/platform.h"
 #include "results/scoring.h"
 #include "support/boards.h"

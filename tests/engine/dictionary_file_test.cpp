@@ -1,9 +1,8 @@
 // The dictionary's file: its bytes, and what is refused.
 #include <gtest/gtest.h>
 
-#include "engine/sealed.h"
+#include "engine/calls.h"
 #include "engine/temp_folder.h"
-#include "engine/words.h"
 
 namespace {
 

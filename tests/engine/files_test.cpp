@@ -1,7 +1,6 @@
-// How files are written: text files, settings, and what is kept of a damaged dictionary.
+// How files are written: text files and settings.
 #include <fcntl.h>
 #include <gtest/gtest.h>
-#include <quorle/word_engine.h>
 #include <sys/file.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
@@ -9,6 +8,7 @@
 
 #include <algorithm>
 
+#include "engine/calls.h"
 #include "engine/temp_folder.h"
 
 namespace {
@@ -26,14 +26,7 @@ class Files : public testing::Test {
         return cWriteTextFile((folder_ / name).c_str()) == 1;
     }
     static bool set(const std::string& key, const std::string& name, const std::string& value) {
-        const auto length = static_cast<std::int32_t>(value.size());
-        return cSetRegValue(key.c_str(), name.c_str(), value.data(), length) == 1;
-    }
-    static std::string get(const std::string& key, const std::string& name) {
-        std::string value(255, '?');
-        std::int32_t length = 255;
-        if (cGetRegValue(key.c_str(), name.c_str(), value.data(), &length) == 0) return "absent";
-        return value.substr(0, static_cast<std::size_t>(length));
+        return cSetRegValue(key.c_str(), name.c_str(), value.data(), int(value.size())) == 1;
     }
     TempFolder folder_;
 };
@@ -67,42 +60,27 @@ TEST_F(Files, AreWrittenThroughDanglingLinksButOnlyWhenAndWhereTheyMayBe) {
     EXPECT_EQ(folder_.read("target"), "cat\n");  // what cannot be read has changed nothing
 }
 
-TEST_F(Files, AreKeptOnceWhenADamagedOneIsReplaced) {
-    folder_.write("Dictionary.dat", "broken");
-    folder_.write("Dictionary.dat.damaged", "broken last year");
-    EXPECT_EQ(cReadBinaryDictionary((folder_ / "Dictionary.dat").c_str()), 0);
-    std::filesystem::create_symlink(folder_.path(), folder_ / "link");
-    for (const char* name : {"good", "link/Dictionary.dat", "Dictionary.dat"}) {
-        EXPECT_TRUE(save(name));
-    }
-    EXPECT_EQ(folder_.read("Dictionary.dat.damaged"), "broken last year");
-    EXPECT_EQ(folder_.read("Dictionary.dat.damaged.2"), "broken");
-    EXPECT_EQ(folder_.names().size(), 5U);
-}
-
 TEST_F(Files, OfSettingsKeepEveryValueAndForeignLine) {
     const std::string longest(255, 'x');
     const std::pair<std::string, std::string> names[] = {
         {"a", "b=c"}, {"a=b", "c"}, {"a\\", "b"}, {"a", "\\b"},       {"[a]", "#b"},
         {"a ", "b"},  {"a", "b"},   {"A", "b"},   {longest, longest}, {"ä", "ü"}};
-    int value = 0;
     for (const auto& [key, name] : names) {
-        EXPECT_EQ(get(key, name), "absent");
-        EXPECT_TRUE(set(key, name, std::to_string(value++)));
+        EXPECT_EQ(Setting(key, name), "absent");
+        EXPECT_TRUE(set(key, name, (name + key).substr(0, 255)));
     }
-    value = 0;
-    for (const auto& [key, name] : names) EXPECT_EQ(get(key, name), std::to_string(value++));
-    EXPECT_TRUE(set("long", "value", longest));
-    EXPECT_EQ(get("long", "value"), longest);
+    for (const auto& [key, name] : names) {
+        EXPECT_EQ(Setting(key, name), (name + key).substr(0, 255));
+    }
     for (const std::string& bad : {longest + "x", std::string("a\tb"), std::string("\n")}) {
         EXPECT_FALSE(set(bad, "name", "value") || set("key", bad, "value") || set("k", "n", bad));
     }
     folder_.write("quorle/settings", "# mine\n\nk\tn\to\tmany\nk\tn\t5\r\nk\tn\tx\nk\tna");
-    EXPECT_EQ(get("k", "n"), "x");
+    EXPECT_EQ(Setting("k", "n"), "x");
     EXPECT_TRUE(set("k", "n", ""));
     EXPECT_EQ(folder_.read("quorle/settings"),
               "# mine\n\nk\tn\to\tmany\nk\tn\t5\r\nk\tn\t\nk\tna\n");
-    EXPECT_EQ(get("k", "n"), "");
+    EXPECT_EQ(Setting("k", "n"), "");
     std::filesystem::remove(folder_ / "quorle/settings");
     std::filesystem::create_directory(folder_ / "quorle/settings");
     EXPECT_FALSE(set("key", "name", "value"));  // unreadable is not empty

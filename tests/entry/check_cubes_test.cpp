@@ -3,7 +3,7 @@
 
 #include <algorithm>
 
-#include "engine/words.h"
+#include "engine/calls.h"
 #include "support/boards.h"
 #include "support/game_fixture.h"
 
@@ -13,15 +13,16 @@ using CheckCubes::IsOnBoard;
 
 class Tracing : public GameFixture {
   protected:
-    static Chain marked() {
-        Chain cells;
-        for (std::size_t k = 0; k < CubeCount; ++k) {
-            if (State.TracedPath[k / 4][k % 4]) cells.push_back(static_cast<int>(k));
-        }
-        return cells;
-    }
     Random random_;
 };
+
+Chain Marked() {
+    Chain cells;
+    for (std::size_t k = 0; k < CubeCount; ++k) {
+        if (State.TracedPath[k / 4][k % 4]) cells.push_back(static_cast<int>(k));
+    }
+    return cells;
+}
 
 // A failure leaves the last cube of the first letter marked, or everything as it was.
 TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
@@ -32,7 +33,7 @@ TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
         putOnBoard(board);
         const std::string word = Text(random_, 1 + random_() % 6, "airtuq") + (i % 3 ? "" : "qu");
         SCOPED_TRACE(word + " on " + board);
-        Chain expected = marked();
+        Chain expected = Marked();
         const std::vector<Chain> chains = ChainsOf(board, word);
         const auto last = board.rfind(static_cast<char>(std::toupper(word[0])));
         const bool isLoneQ = word[0] == 'q' && word != "q" && word[1] != 'u';
@@ -43,14 +44,14 @@ TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
             ++onBoard;
         }
         ASSERT_EQ(IsOnBoard(word) == True, !chains.empty());
-        ASSERT_EQ(marked(), expected);
+        ASSERT_EQ(Marked(), expected);
     }
     EXPECT_GT(onBoard, 400);
     for (const char* word : {"Air", "a r", "a1r", "air ", "x\xC3\xA9"}) {
         EXPECT_FALSE(IsOnBoard(word)) << word;
     }
     EXPECT_TRUE(IsOnBoard(""));
-    EXPECT_EQ(marked(), Chain{});
+    EXPECT_EQ(Marked(), Chain{});
 }
 
 TEST_F(Tracing, AndTheEnginesSearchFindTheSameWords) {

@@ -1,6 +1,6 @@
 #pragma once
-// Words by chance, and those that the engine holds, lists and finds. A promise of the interface
-// that is broken throws: a test fails by that, and a fuzz target ends.
+// The engine's calls with texts and sets of words. A promise of the interface that is broken
+// throws: a test fails by that, and a fuzz target ends.
 #include <quorle/word_engine.h>
 
 #include <functional>
@@ -69,4 +69,27 @@ inline std::int32_t Step(std::int32_t percent, const char* path = "dummy") {
 
 inline void Finish(std::int32_t percent) {
     while (percent < 100) percent = Step(percent);
+}
+
+inline std::string Setting(const std::string& key, const std::string& name) {
+    std::string value(255, '?');
+    std::int32_t length = 255;
+    const std::int32_t present = cGetRegValue(key.c_str(), name.c_str(), value.data(), &length);
+    REQUIRE(length >= 0 && length <= 255 && (present == 1 || length == 0));
+    return present == 1 ? value.substr(0, static_cast<std::size_t>(length)) : "absent";
+}
+
+/// The dictionary file with the CRC-32C of all its other bytes put in, where it has the room.
+inline std::string Sealed(std::string file) {
+    constexpr std::size_t At = 4, End = 8;
+    std::uint32_t checksum = ~0U;
+    for (std::size_t i = 0; i < file.size(); ++i) {
+        if (i >= At && i < End) continue;
+        checksum ^= static_cast<unsigned char>(file[i]);
+        for (int bit = 0; bit < 8; ++bit) checksum = checksum >> 1 ^ (checksum & 1) * 0x82F63B78U;
+    }
+    for (std::size_t i = At; i < End && file.size() >= End; ++i, checksum >>= 8) {
+        file[i] = static_cast<char>(~checksum);
+    }
+    return file;
 }
