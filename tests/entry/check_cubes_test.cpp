@@ -11,10 +11,7 @@ namespace {
 
 using CheckCubes::IsOnBoard;
 
-class Tracing : public GameFixture {
-  protected:
-    Random random_;
-};
+class Tracing : public GameFixture {};
 
 Chain Marked() {
     Chain cells;
@@ -26,12 +23,13 @@ Chain Marked() {
 
 // A failure leaves the last cube of the first letter marked, or everything as it was.
 TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
+    Random random;
     int onBoard = 0;
     for (int i = 0; i < 4000; ++i) {
-        std::string board = Text(random_, CubeCount, "AIRTU");  // most words have many chains
-        if (i % 4 != 0) board[random_() % CubeCount] = 'Q';
+        std::string board = Text(random, CubeCount, "AIRTU");  // most words have many chains
+        if (i % 4 != 0) board[random() % CubeCount] = 'Q';
         putOnBoard(board);
-        const std::string word = Text(random_, 1 + random_() % 6, "airtuq") + (i % 3 ? "" : "qu");
+        const std::string word = Text(random, 1 + random() % 6, "airtuq") + (i % 3 ? "" : "qu");
         SCOPED_TRACE(word + " on " + board);
         Chain expected = Marked();
         const std::vector<Chain> chains = ChainsOf(board, word);
@@ -58,6 +56,7 @@ TEST_F(Tracing, AndTheEnginesSearchFindTheSameWords) {
     ASSERT_EQ(cReadBinaryDictionary(QUORLE_DEFAULT_DICTIONARY), 1);
     for (const char* word : {"suq", "talaq", "qaid", "tariqat", "qua"}) cDictionaryAdd(word);
     const WordSet all = AllWords();
+    Random random;
     std::string board = "seaslrtneaiespmd";  // very many words
     for (int i = 0; i < 5; ++i) {
         const WordSet found = Found(cCheckForAllDefinedWords(board.c_str()));
@@ -69,7 +68,7 @@ TEST_F(Tracing, AndTheEnginesSearchFindTheSameWords) {
         }
         EXPECT_EQ(found, traced) << board;
         EXPECT_TRUE(i > 0 || found.size() > 300);
-        board = Text(random_, 15, "aeioustrnldpst") + 'q';
+        board = Text(random, 15, "aeioustrnldpst") + 'q';
     }
 }
 
