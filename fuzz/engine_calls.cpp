@@ -7,16 +7,11 @@
 
 namespace {
 
+const TempFolder Folder;
 const std::uint8_t* At;
 const std::uint8_t* End;
 WordSet Held;
 std::int32_t Min, Max;
-
-const TempFolder& Folder() {
-    setenv("TMPDIR", "/dev/shm", 0);  // in memory, if the fuzzing is to be quick
-    static const TempFolder folder;
-    return folder;
-}
 
 int Number() {
     return At == End ? 0 : *At++;
@@ -76,13 +71,13 @@ void ChangeLimits() {
 }
 
 std::string Saved() {
-    REQUIRE(cWriteBinaryDictionary((Folder() / "Dictionary.dat").c_str()) == 1);
-    return Folder().read("Dictionary.dat");
+    REQUIRE(cWriteBinaryDictionary((Folder / "Dictionary.dat").c_str()) == 1);
+    return Folder.read("Dictionary.dat");
 }
 
 /// Any bytes, the checksum made right: refused, or a dictionary that works.
 void LoadAnything() {
-    if (cReadBinaryDictionary(Folder().write("file", Sealed(Bytes())).c_str()) == 0) return;
+    if (cReadBinaryDictionary(Folder.write("file", Sealed(Bytes())).c_str()) == 0) return;
     // Few bytes can spell very many words; such a dictionary is not read through.
     if (cNumberOfWords() > 20'000) cDictionaryClear();
     Held = AllWords();
@@ -92,7 +87,7 @@ void LoadAnything() {
 
 void MergeAnything() {
     std::string text = Bytes();
-    Finish(Step(0, Folder().write("words", text).c_str()));
+    Finish(Step(0, Folder.write("words", text).c_str()));
     if (text.starts_with("\xEF\xBB\xBF")) text.erase(0, 3);
     for (std::size_t end = 0; end != text.npos; text.erase(0, end + 1)) {
         end = text.find_first_of(" \t\n\v\f\r");
@@ -104,7 +99,7 @@ void MergeAnything() {
 
 /// Values are read or absent, and storing one keeps the others.
 void ReadAnySettings() {
-    Folder().write("quorle/settings", Bytes());
+    Folder.write("quorle/settings", Bytes());
     Setting("key", "name");
     const std::string other = Setting("key", "other");
     REQUIRE(cSetRegValue("key", "name", "stored", 6) == 1);
@@ -157,7 +152,7 @@ void SaveAndLoad() {
     Remove();
     ChangeLimits();
     REQUIRE(cReadBinaryDictionary(Word().c_str()) == 0);
-    REQUIRE(cReadBinaryDictionary((Folder() / "Dictionary.dat").c_str()) == 1);
+    REQUIRE(cReadBinaryDictionary((Folder / "Dictionary.dat").c_str()) == 1);
     Held = held;
     Max = max;
 }
@@ -166,7 +161,7 @@ void SaveAndLoad() {
 void Check() {
     REQUIRE(AllWords() == Held && cMinWordSize() == Min && cMaxWordSize() == Max);
     cSetMaxWordSize(Max = 16);
-    const std::string edited = Saved(), words = Folder() / "words";
+    const std::string edited = Saved(), words = Folder / "words";
     REQUIRE(cWriteTextFile(words.c_str()) == 1 && cDictionaryClear() == 1);
     Finish(Step(0, words.c_str()));
     REQUIRE(Saved() == edited);
@@ -177,7 +172,7 @@ void Check() {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     At = data;
     End = data + size;
-    setenv("XDG_CONFIG_HOME", Folder().path().c_str(), 1);
+    setenv("XDG_CONFIG_HOME", Folder.path().c_str(), 1);
     cDictionaryClear();
     cSetMinWordSize(Min = 3);
     cSetMaxWordSize(Max = 16);

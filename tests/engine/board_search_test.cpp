@@ -65,9 +65,8 @@ TEST_P(BoardSearchTest, FindsWhatTryingEveryWordFinds) {
     }
 }
 
-INSTANTIATE_TEST_SUITE_P(All, BoardSearchTest,
-                         testing::Values(Matching::Plain, CanMatch(Matching::Avx2)
-                                                              ? Matching::Avx2
-                                                              : Matching::Plain));
+// Where the machine has but the one way, it is tested twice.
+const auto Best = CanMatch(Matching::Avx2) ? Matching::Avx2 : Matching::Plain;
+INSTANTIATE_TEST_SUITE_P(All, BoardSearchTest, testing::Values(Matching::Plain, Best));
 
 }  // namespace

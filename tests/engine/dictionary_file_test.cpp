@@ -53,7 +53,6 @@ TEST_F(DictionaryFile, KeepsItsFormAndAnyDamageToItDoesNone) {
             ++loaded;
         }
     }
-    std::cout << loaded << " changed files were sound\n";
     EXPECT_GT(loaded, 50);
 }
 

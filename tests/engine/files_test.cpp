@@ -91,17 +91,18 @@ TEST_F(Files, OfSettingsKeepEveryValueAndForeignLine) {
 }
 
 TEST_F(Files, OfSettingsHoldTheValuesOfProgramsAtOnce) {
-    for (const char program : {'a', 'b', 'c', 'd'}) {
+    int start[2];
+    ASSERT_EQ(pipe(start), 0);
+    for (int program = 0; program < 100; ++program) {
         if (fork() != 0) continue;
-        for (std::string name(1, program); name.size() <= 25; name += 'x') {
-            while (!set("key", name, "value")) continue;  // the lock was kept for too long
-        }
+        close(start[1]);
+        EXPECT_EQ(read(start[0], start, 1), 0);                          // until all are there
+        while (!set("key", std::to_string(program), "value")) continue;  // locked for too long
         _exit(0);
     }
-    int status = 0;
-    while (wait(&status) > 0) EXPECT_EQ(status, 0);
-    const std::string all = folder_.read("quorle/settings");
-    EXPECT_EQ(std::count(all.begin(), all.end(), '\n'), 4 * 25);
+    close(start[1]);
+    while (wait(nullptr) > 0) continue;
+    EXPECT_EQ(std::ranges::count(folder_.read("quorle/settings"), '\n'), 100);
 }
 
 }  // namespace

@@ -51,7 +51,7 @@ TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
 
 TEST_F(Tracing, AndTheEnginesSearchFindTheSameWords) {
     ASSERT_EQ(cReadBinaryDictionary(QUORLE_DEFAULT_DICTIONARY), 1);
-    for (const char* word : {"suq", "talaq", "qaid", "tariqat", "qua"}) cDictionaryAdd(word);
+    ASSERT_EQ(cDictionaryAdd("suq"), 1);
     const WordSet all = AllWords();
     Random random;
     std::string board = "seaslrtneaiespmd";  // very many words

@@ -13,32 +13,26 @@ namespace {
 const Plan* Now = nullptr;
 std::vector<std::string> Calls;
 
-/// What is to happen at this call.
-Fault Next(const std::string& call) {
-    if (Now == nullptr) return Fault::None;
-    errno = Now->error;
-    if (Now->noLinks && call == "linkat") return errno = EPERM, Fault::Error;
-    Calls.push_back(call);
-    if (Calls.size() != Now->number) return Fault::None;
-    if (Now->fault == Fault::Kill) raise(SIGKILL);
-    return Now->fault;
+bool IsDue(Fault fault) {
+    return Now != nullptr && Calls.size() == Now->number && Now->fault == fault;
 }
 
-/// Of what is to be read or written one byte.
+/// What is to be read or written may be cut short.
 template <typename Argument>
 Argument Cut(Argument argument) {
-    if constexpr (std::is_same_v<Argument, size_t>) return 1;
-    return argument;
+    return std::is_same_v<Argument, size_t> && IsDue(Fault::Short) ? Argument(1) : argument;
 }
 
 template <typename Result, typename... Arguments>
-Result Perform(const char* call, long number, Arguments... arguments) {
-    const Fault fault = Next(call);
-    if (fault == Fault::Short) return static_cast<Result>(syscall(number, Cut(arguments)...));
-    if (fault != Fault::Error) return static_cast<Result>(syscall(number, arguments...));
+Result Perform(const std::string& call, long number, Arguments... arguments) {
+    const bool noLink = Now != nullptr && Now->noLinks && call == "linkat";
+    if (Now != nullptr && !noLink) Calls.push_back(call);
+    if (IsDue(Fault::Kill)) raise(SIGKILL);
+    const bool fails = noLink || IsDue(Fault::Error);
     // A descriptor is gone whatever its closing says.
-    if (number == SYS_close) syscall(number, arguments...);
-    return -1;
+    const long result = fails && number != SYS_close ? -1 : syscall(number, Cut(arguments)...);
+    if (fails) errno = noLink ? EPERM : Now->error;
+    return fails ? -1 : static_cast<Result>(result);
 }
 
 }  // namespace

@@ -7,7 +7,6 @@
 
 #include <algorithm>
 #include <cstring>
-#include <iostream>
 
 #include "engine/temp_folder.h"
 #include "faulty_calls.h"
@@ -142,7 +141,6 @@ class Saving : public testing::TestWithParam<Scenario> {
 TEST_P(Saving, SurvivesEveryFault) {
     Plan plan{GetParam().noLinks};
     std::string order;
-    int faults = 0;
     for (const std::string& call : saveWith(plan)) {
         SCOPED_TRACE(call + ", call " + std::to_string(++plan.number));
         plan.fault = Fault::Error;
@@ -153,15 +151,11 @@ TEST_P(Saving, SurvivesEveryFault) {
         plan.fault = Fault::Kill;
         killAt(plan);
         plan.fault = Fault::Short;
-        const bool transfers = call == "read" || call == "write";
-        if (transfers) saveWith(plan);
-        faults += transfers ? 7 : 6;
+        if (call == "read" || call == "write") saveWith(plan);
         if (call == "write" || call == "fsync" || call == "renameat") order += call + " ";
     }
     EXPECT_NE(order.find("write fsync renameat "), order.npos);
     EXPECT_TRUE(order.ends_with("renameat fsync "));
-    std::cout << "faults injected: " << faults << "\n";
-    EXPECT_GT(faults, 50);
 }
 
 INSTANTIATE_TEST_SUITE_P(Scenarios, Saving, testing::ValuesIn(Scenarios),
