@@ -1,36 +1,36 @@
-// Any sequence of engine calls with any arguments, against a plain set of words.
+// Any sequence of engine calls with any arguments and files, against a plain set of words.
 #include <algorithm>
-#include <set>
-#include <vector>
 
-#include "fuzz_target.h"
+#include "engine/calls.h"
+#include "engine/temp_folder.h"
+#include "support/chains.h"
 
 namespace {
 
-using Words = std::set<std::string>;
-
+const TempFolder Folder;
 const std::uint8_t* At;
 const std::uint8_t* End;
-Words Held, Saved;
-std::int32_t Min, Max, SavedMax;
+WordSet Held;
+std::int32_t Min, Max;
 
-std::int32_t Number() {
+int Number() {
     return At == End ? 0 : *At++;
-}
-
-std::string File() {
-    return Fuzz::Folder() + "/Dictionary.dat";
 }
 
 /// Mostly a short word of few letters, so that words meet; now and then anything.
 std::string Word() {
     const int shape = Number();
     std::string text(static_cast<std::size_t>(shape % 19), 'a');
-    for (char& c : text) {
-        const int letter = Number();
-        c = static_cast<char>(shape >= 240 ? letter : 'a' + letter % 3);
-    }
+    for (char& c : text) c = shape >= 240 ? static_cast<char>(Number()) : "aquc"[Number() % 4];
     return text.c_str();
+}
+
+/// As many bytes as the next two say.
+std::string Bytes() {
+    const std::ptrdiff_t low = Number(), size = low + 256 * Number();
+    const std::string bytes(At, At + std::min(size, End - At));
+    At += bytes.size();
+    return bytes;
 }
 
 bool Fits(const std::string& text) {
@@ -38,8 +38,7 @@ bool Fits(const std::string& text) {
            text.find_first_not_of("abcdefghijklmnopqrstuvwxyz") == std::string::npos;
 }
 
-void Add() {
-    const std::string text = Word();
+void Add(const std::string& text) {
     const int added = cDictionaryAdd(text.c_str());
     REQUIRE(Held.count(text) == 1 || added == (Fits(text) ? 1 : 0));
     if (Fits(text)) Held.insert(text);
@@ -71,49 +70,62 @@ void ChangeLimits() {
     std::erase_if(Held, [](auto& each) { return static_cast<int>(each.size()) > Max; });
 }
 
-void Save() {
-    REQUIRE(cWriteBinaryDictionary(File().c_str()) == 1);
-    Saved = Held;
-    SavedMax = Max;
+std::string Saved() {
+    REQUIRE(cWriteBinaryDictionary((Folder / "Dictionary.dat").c_str()) == 1);
+    return Folder.read("Dictionary.dat");
 }
 
-void Load() {
-    REQUIRE(cReadBinaryDictionary(Word().c_str()) == 0);
-    REQUIRE(cReadBinaryDictionary(File().c_str()) == 1);
-    Held = Saved;
-    Max = SavedMax;
+/// Any bytes, the checksum made right: refused, or a dictionary that works.
+void LoadAnything() {
+    if (cReadBinaryDictionary(Folder.write("file", Sealed(Bytes())).c_str()) == 0) return;
+    // Few bytes can spell very many words; such a dictionary is not read through.
+    if (cNumberOfWords() > 20'000) cDictionaryClear();
+    Held = AllWords();
+    Max = cMaxWordSize();
+    REQUIRE(Max >= 2 && Max <= 16);
 }
 
-void Merge() {
-    std::string text;
-    for (int i = Number() % 40; i > 0; --i) {
-        const std::string token = Word();
-        if (!Fits(token)) continue;  // what else a file may hold has a target of its own
-        text += token + "\n";
-        Held.insert(token);
+void MergeAnything() {
+    std::string text = Bytes();
+    Finish(Step(0, Folder.write("words", text).c_str()));
+    if (text.starts_with("\xEF\xBB\xBF")) text.erase(0, 3);
+    for (std::size_t end = 0; end != text.npos; text.erase(0, end + 1)) {
+        end = text.find_first_of(" \t\n\v\f\r");
+        std::string token = text.substr(0, end);
+        for (char& c : token) c = static_cast<char>(c >= 'A' && c <= 'Z' ? c - 'A' + 'a' : c);
+        if (Fits(token)) Held.insert(token);
     }
-    Fuzz::Merge(Fuzz::Write("words.txt", text));
 }
 
-// Later changes reach neither the results nor a listing.
+/// Values are read or absent, and storing one keeps the others.
+void ReadAnySettings() {
+    Folder.write("quorle/settings", Bytes());
+    Setting("key", "name");
+    const std::string other = Setting("key", "other");
+    REQUIRE(cSetRegValue("key", "name", "stored", 6) == 1);
+    REQUIRE(Setting("key", "name") == "stored" && Setting("key", "other") == other);
+}
+
+/// What lies on the board is found. Later changes reach neither the results nor a listing.
 void Search() {
-    std::string board(16, 'a');
-    for (char& c : board) c = static_cast<char>('a' + Number() % 3);
-    cCheckForAllDefinedWords(Word().c_str());  // hardly ever a board
+    std::string board, snake;
+    while (board.size() < 16) board += "aquc"[(board.size() + Number()) % 4];
+    for (const std::size_t cube : {0, 1, 2, 3, 7, 6, 5, 4, 8, 9, 10, 11, 15, 14, 13, 12}) {
+        snake += board[cube] == 'q' ? "qu" : board.substr(cube, 1);
+    }
+    Add(snake.substr(0, static_cast<std::size_t>(Number() % 17)));
+    WordSet lying;
+    std::copy_if(Held.begin(), Held.end(), std::inserter(lying, lying.end()), [&](auto& word) {
+        const auto size = static_cast<int>(word.size());
+        return size >= Min && size <= Max && Lies(board, word);
+    });
+    REQUIRE(Number() > 0 || cCheckForAllDefinedWords(Bytes().substr(0, 15).c_str()) == 0);
     const std::int32_t found = cCheckForAllDefinedWords(board.c_str());
-    const Words before = Held;
-    REQUIRE(cStartDecodingWords(0, 1) == 1);
-    const auto outside = [min = Min, max = Max](const std::string& word) {
-        return static_cast<int>(word.size()) < min || static_cast<int>(word.size()) > max;
-    };
+    const WordSet listed(Held.lower_bound("aq"), Held.lower_bound("ar"));
+    REQUIRE(cStartDecodingWords(0, 'q' - 'a') == 1);
     Remove();
     ChangeLimits();
-    const Words results = Fuzz::Results(found);
-    REQUIRE(std::ranges::none_of(results, outside));
-    REQUIRE(std::includes(before.begin(), before.end(), results.begin(), results.end()));
-    Words listed;
-    Fuzz::ReadListing(listed);
-    REQUIRE(listed == Words(before.lower_bound("ab"), before.lower_bound("ac")));
+    REQUIRE(Found(found) == lying && Written(cDecodeNextWord) == listed);
 }
 
 void Nonsense() {
@@ -131,20 +143,28 @@ void Nonsense() {
     REQUIRE(cSetRegValue("k", "n", "text", -1 - Number()) == 0);
 }
 
-/// The engine holds exactly the words it should.
+/// What is saved is loaded again, whatever comes between.
+void SaveAndLoad() {
+    const std::int32_t max = Max;
+    const WordSet held = Held;
+    Saved();
+    Add(Word());
+    Remove();
+    ChangeLimits();
+    REQUIRE(cReadBinaryDictionary(Word().c_str()) == 0);
+    REQUIRE(cReadBinaryDictionary((Folder / "Dictionary.dat").c_str()) == 1);
+    Held = held;
+    Max = max;
+}
+
+/// The engine holds what it should, and saves it as if it were built at once.
 void Check() {
-    REQUIRE(cNumberOfWords() == static_cast<std::int32_t>(Held.size()));
-    REQUIRE(cMinWordSize() == Min && cMaxWordSize() == Max);
-    Words listed;
-    for (std::int32_t first = 0; first < 26; ++first) {
-        for (std::int32_t second = 0; second < 26; ++second) {
-            const auto index = static_cast<std::int32_t>(listed.size());
-            Fuzz::List(first, second, listed);
-            const bool any = static_cast<std::int32_t>(listed.size()) > index;
-            REQUIRE(cDictIndex(first, second) == (any ? index : -1));
-        }
-    }
-    REQUIRE(listed == Held);
+    REQUIRE(AllWords() == Held && cMinWordSize() == Min && cMaxWordSize() == Max);
+    cSetMaxWordSize(Max = 16);
+    const std::string edited = Saved(), words = Folder / "words";
+    REQUIRE(cWriteTextFile(words.c_str()) == 1 && cDictionaryClear() == 1);
+    Finish(Step(0, words.c_str()));
+    REQUIRE(Saved() == edited);
 }
 
 }  // namespace
@@ -152,14 +172,15 @@ void Check() {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     At = data;
     End = data + size;
+    setenv("XDG_CONFIG_HOME", Folder.path().c_str(), 1);
     cDictionaryClear();
     cSetMinWordSize(Min = 3);
     cSetMaxWordSize(Max = 16);
     Held.clear();
-    Save();
     using Call = void (*)();
-    constexpr Call Calls[] = {Add,          Add,  Add,  Add,   Remove, Remove,   LookUp,
-                              ChangeLimits, Save, Load, Merge, Search, Nonsense, Check};
+    constexpr Call Add3 = [] { Add(Word()), Add(Word()), Add(Word()); };
+    constexpr Call Calls[] = {Add3,          Remove,          LookUp, ChangeLimits, LoadAnything,
+                              MergeAnything, ReadAnySettings, Search, SaveAndLoad,  Nonsense};
     while (At != End) Calls[static_cast<std::size_t>(Number()) % std::size(Calls)]();
     Check();
     return 0;

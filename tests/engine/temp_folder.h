@@ -10,23 +10,24 @@
 
 class TempFolder {
   public:
-    TempFolder() {
-        std::string pattern = std::filesystem::temp_directory_path() / "quorle_XXXXXX";
-        path_ = mkdtemp(pattern.data());
-    }
+    TempFolder() { mkdtemp(path_.data()); }
     TempFolder(const TempFolder&) = delete;
     TempFolder& operator=(const TempFolder&) = delete;
     ~TempFolder() { std::filesystem::remove_all(path_); }
 
-    std::string operator/(const std::string& name) const { return path_ / name; }
-    const std::filesystem::path& path() const { return path_; }
+    std::string operator/(const std::string& name) const { return path_ + "/" + name; }
+    const std::string& path() const { return path_; }
 
-    void write(const std::string& name, const std::string& text) const {
-        std::filesystem::create_directories((path_ / name).parent_path());
-        std::ofstream(path_ / name, std::ios::binary) << text;
+    /// Returns the file's path.
+    std::string write(const std::string& name, const std::string& text) const {
+        const std::filesystem::path path = path_ + "/" + name;
+        std::filesystem::create_directories(path.parent_path());
+        std::filesystem::remove(path);  // writing it over would wait for the disk
+        std::ofstream(path, std::ios::binary) << text;
+        return path;
     }
     std::string read(const std::string& name) const {
-        std::ifstream file(path_ / name, std::ios::binary);
+        std::ifstream file(path_ + "/" + name, std::ios::binary);
         return {std::istreambuf_iterator<char>(file), {}};
     }
     std::set<std::string> names() const {
@@ -38,5 +39,5 @@ class TempFolder {
     }
 
   private:
-    std::filesystem::path path_;
+    std::string path_ = std::filesystem::temp_directory_path() / "quorle_XXXXXX";
 };

@@ -1,105 +1,74 @@
 #include "faulty_calls.h"
 
-#include <fcntl.h>
 #include <signal.h>
-#include <stdarg.h>
 #include <sys/stat.h>
 #include <sys/syscall.h>
 #include <unistd.h>
 
-#include <algorithm>
 #include <cerrno>
 
 namespace FaultyCalls {
 namespace {
 
-Plan Now;
-bool Armed = false;
-std::map<std::string, int> Calls;
+const Plan* Now = nullptr;
+std::vector<std::string> Calls;
 
-/// What is to happen at this call.
-Fault Next(const char* call) {
-    if (!Armed) return Fault::None;
-    const bool due = ++Calls[call] == Now.number && Now.call == call;
-    if (due && Now.fault == Fault::Kill) raise(SIGKILL);
-    return due ? Now.fault : Fault::None;
+bool IsDue(Fault fault) {
+    return Now != nullptr && Calls.size() == Now->number && Now->fault == fault;
 }
 
-template <typename... Arguments>
-long Perform(const char* call, long number, Arguments... arguments) {
-    if (Next(call) != Fault::Error) return syscall(number, arguments...);
+/// What is to be read or written may be cut short.
+template <typename Argument>
+Argument Cut(Argument argument) {
+    return std::is_same_v<Argument, size_t> && IsDue(Fault::Short) ? Argument(1) : argument;
+}
+
+template <typename Result, typename... Arguments>
+Result Perform(const std::string& call, long number, Arguments... arguments) {
+    const bool noLink = Now != nullptr && Now->noLinks && call == "linkat";
+    if (Now != nullptr && !noLink) Calls.push_back(call);
+    if (IsDue(Fault::Kill)) raise(SIGKILL);
+    const bool fails = noLink || IsDue(Fault::Error);
     // A descriptor is gone whatever its closing says.
-    if (number == SYS_close) syscall(number, arguments...);
-    errno = Now.error;
-    return -1;
-}
-
-template <typename Data>
-ssize_t Transfer(const char* call, long number, int file, Data* data, size_t size) {
-    const Fault fault = Next(call);
-    errno = Now.error;
-    if (fault == Fault::Error) return -1;
-    return syscall(number, file, data, fault == Fault::Short ? std::min<size_t>(size, 1) : size);
+    const long result = fails && number != SYS_close ? -1 : syscall(number, Cut(arguments)...);
+    if (fails) errno = noLink ? EPERM : Now->error;
+    return fails ? -1 : static_cast<Result>(result);
 }
 
 }  // namespace
 
-void Arm(const Plan& plan) {
-    Now = plan;
+std::vector<std::string> During(const Plan& plan, const std::function<void()>& work) {
     Calls.clear();
-    Armed = true;
-}
-
-std::map<std::string, int> Disarm() {
-    Armed = false;
+    Now = &plan;
+    work();
+    Now = nullptr;
     return Calls;
 }
 
 }  // namespace FaultyCalls
 
-using namespace FaultyCalls;
-
-extern "C" {
-
-int openat(int folder, const char* path, int flags, ...) {
-    va_list rest;
-    va_start(rest, flags);
-    const mode_t mode = (flags & O_CREAT) != 0 ? va_arg(rest, mode_t) : 0;
-    va_end(rest);
-    return static_cast<int>(Perform("openat", SYS_openat, folder, path, flags, mode));
-}
-ssize_t write(int file, const void* data, size_t size) {
-    return Transfer("write", SYS_write, file, data, size);
-}
-ssize_t read(int file, void* data, size_t size) {
-    return Transfer("read", SYS_read, file, data, size);
-}
-ssize_t readlink(const char* path, char* link, size_t size) {
-    return Perform("readlink", SYS_readlink, path, link, size);
-}
-int linkat(int from, const char* path, int to, const char* name, int flags) {
-    const bool possible = !Armed || !Now.noLinks;
-    if (possible)
-        return static_cast<int>(Perform("linkat", SYS_linkat, from, path, to, name, flags));
-    errno = EPERM;
-    return -1;
-}
-
-#define CALL(name, number, parameters, ...)                           \
-    int name parameters {                                             \
-        return static_cast<int>(Perform(#name, number, __VA_ARGS__)); \
+#define CALL(result, name, number, parameters, ...)                      \
+    extern "C" result name parameters {                                  \
+        return FaultyCalls::Perform<result>(#name, number, __VA_ARGS__); \
     }
-CALL(close, SYS_close, (int file), file)
-CALL(fsync, SYS_fsync, (int file), file)
-CALL(fchmod, SYS_fchmod, (int file, mode_t mode), file, mode)
-CALL(fchown, SYS_fchown, (int file, uid_t owner, gid_t group), file, owner, group)
-CALL(flock, SYS_flock, (int file, int operation), file, operation)
-CALL(fstat, SYS_fstat, (int file, struct stat* status), file, status)
-CALL(lstat, SYS_lstat, (const char* path, struct stat* status), path, status)
-CALL(fstatat, SYS_newfstatat, (int folder, const char* path, struct stat* status, int flags),
+// Without its header openat() needs no list of any arguments.
+CALL(int, openat, SYS_openat, (int folder, const char* path, int flags, mode_t mode), folder, path,
+     flags, mode)
+CALL(ssize_t, read, SYS_read, (int file, void* data, size_t size), file, data, size)
+CALL(ssize_t, write, SYS_write, (int file, const void* data, size_t size), file, data, size)
+CALL(ssize_t, readlink, SYS_readlink, (const char* path, char* link, size_t size), path, link, size)
+CALL(int, close, SYS_close, (int file), file)
+CALL(int, fsync, SYS_fsync, (int file), file)
+CALL(int, flock, SYS_flock, (int file, int operation), file, operation)
+CALL(int, fchmod, SYS_fchmod, (int file, mode_t mode), file, mode)
+CALL(int, fchown, SYS_fchown, (int file, uid_t owner, gid_t group), file, owner, group)
+CALL(int, fstat, SYS_fstat, (int file, struct stat* status), file, status)
+CALL(int, lstat, SYS_lstat, (const char* path, struct stat* status), path, status)
+CALL(int, fstatat, SYS_newfstatat, (int folder, const char* path, struct stat* status, int flags),
      folder, path, status, flags)
-CALL(unlinkat, SYS_unlinkat, (int folder, const char* path, int flags), folder, path, flags)
-CALL(renameat, SYS_renameat, (int from, const char* path, int to, const char* name), from, path, to,
-     name)
-CALL(mkdir, SYS_mkdir, (const char* path, mode_t mode), path, mode)
-}
+CALL(int, linkat, SYS_linkat, (int from, const char* path, int to, const char* name, int flags),
+     from, path, to, name, flags)
+CALL(int, renameat, SYS_renameat, (int from, const char* path, int to, const char* name), from,
+     path, to, name)
+CALL(int, unlinkat, SYS_unlinkat, (int folder, const char* path, int flags), folder, path, flags)
+CALL(int, mkdir, SYS_mkdir, (const char* path, mode_t mode), path, mode)

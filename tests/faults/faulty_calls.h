@@ -1,25 +1,22 @@
 #pragma once
 // System calls that fail when told to. Linked ahead of the C library, the functions of this unit
 // are what every other part of the program calls.
-#include <map>
+#include <functional>
 #include <string>
+#include <vector>
 
 namespace FaultyCalls {
 
 enum class Fault { None, Error, Short, Kill };
 
 struct Plan {
-    Fault fault = Fault::None;
-    std::string call;  // the function's name
-    int number = 0;    // which of its calls, from 1
-    int error = 0;     // errno for Fault::Error
     bool noLinks = false;
+    std::size_t number = 0;  // which of the calls, from 1
+    Fault fault = Fault::None;
+    int error = 0;  // errno for Fault::Error
 };
 
-/// Counts calls, and carries out the plan, from now on.
-void Arm(const Plan& plan);
-
-/// Ends that; returns how often each function was called.
-std::map<std::string, int> Disarm();
+/// Carries out the plan while `work` runs; returns the names of the functions that were called.
+std::vector<std::string> During(const Plan& plan, const std::function<void()>& work);
 
 }  // namespace FaultyCalls

@@ -3,7 +3,6 @@
 #include <QApplication>
 #include <QProxyStyle>
 #include <QTimer>
-#include <cstdio>
 
 static void ReportStyle() {
     QTimer::singleShot(500, [] {
@@ -11,8 +10,7 @@ static void ReportStyle() {
         while (const auto* added = qobject_cast<const QProxyStyle*>(style)) {
             style = added->baseStyle();
         }
-        std::printf("%s\n", qPrintable(style->name()));
-        std::fflush(stdout);
+        qInfo("%s", qPrintable(style->name()));
         std::_Exit(0);
     });
 }
