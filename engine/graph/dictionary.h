@@ -1,6 +1,7 @@
 #pragma once
 // The dictionary in use: its words, the limits on their size, and a short way to a word.
 #include <array>
+#include <utility>
 
 #include "graph/word_graph.h"
 
@@ -17,20 +18,51 @@ class Dictionary {
     WordLimits limits;
 
     const WordGraph& words() const { return words_; }
-    void replace(WordGraph words) noexcept;
+    void replace(WordGraph words) {
+        words_ = std::move(words);
+        for (char first = 'a'; first <= 'z'; ++first) {
+            for (char second = 'a'; second <= 'z'; ++second) renew(first, second);
+        }
+    }
     /// As of WordGraph; words of 2 letters and more.
-    bool set(std::string_view word, bool isHeld);
+    bool set(std::string_view word, bool isHeld) {
+        const bool changed = words_.set(word, isHeld);
+        if (changed) renew(word[0], word[1]);
+        return changed;
+    }
 
     /// Follows a text, which may hold anything: what an edge says of the letters that words go on
     /// with, and WordEnds; 0 when no word begins so.
-    std::uint32_t lookUp(const char* text) const;
+    std::uint32_t lookUp(const char* text) const {
+        return CountingBits([this, text] {
+            const char* at = text;
+            const Edge* const edges = words_.edges();
+            const Edge* edge = &words_.root();
+            if (numberOf(at[0]) < Letters && numberOf(at[1]) < Letters) {
+                edge = &beginnings_[numberOf(at[0]) * Letters + numberOf(at[1])];
+                at += 2;
+            }
+            for (; *at != 0; ++at) {
+                const std::uint32_t letter = numberOf(*at);
+                if (letter >= Letters || (edge->letters >> letter & 1) == 0) return 0U;
+                edge = edges + edge->at(1U << letter);
+            }
+            return edge->letters;
+        });
+    }
 
   private:
-    void renew(std::string_view beginning);
+    static std::uint32_t numberOf(char letter) { return static_cast<std::uint32_t>(letter - 'a'); }
+
+    // An edit changes where the edges on its path lead, and no others'.
+    void renew(char first, char second) {
+        const char both[] = {first, second};
+        beginnings_[numberOf(first) * Letters + numberOf(second)] = words_.find({both, 2});
+    }
 
     WordGraph words_;
     // The edges of all beginnings of two letters: two steps less.
-    std::array<Edge, Letters * Letters> beginnings_{};
+    std::array<Edge, std::size_t{Letters} * Letters> beginnings_{};
 };
 
 }  // namespace Quorle

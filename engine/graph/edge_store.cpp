@@ -23,8 +23,8 @@ std::uint32_t CountWords(const Edge* edges, const Edge& edge) {
 }
 
 EdgeStore::EdgeStore() {
-    reserve(1);
-    edges_[append(1)] = {};
+    append(1);
+    edges_[0] = {};
 }
 
 EdgeStore::~EdgeStore() {
@@ -35,9 +35,8 @@ void EdgeStore::reserve(std::size_t count) {
     const std::size_t needed = size_ + count;
     if (needed <= capacity_) return;
     if (needed > MostEdges) throw std::bad_alloc();
-    // Small steps: memory, not time, is what an edit should spare, and the C library moves large
-    // arrays by their pages.
-    const std::size_t capacity = std::max(needed, capacity_ + capacity_ / 16);
+    // The C library moves large arrays by their pages.
+    const std::size_t capacity = std::max(needed, capacity_ + capacity_ / 8);
     void* grown = std::realloc(static_cast<void*>(edges_), capacity * sizeof(Edge));
     if (grown == nullptr) throw std::bad_alloc();
     edges_ = static_cast<Edge*>(grown);
@@ -45,10 +44,9 @@ void EdgeStore::reserve(std::size_t count) {
 }
 
 std::uint32_t EdgeStore::append(std::size_t count) {
-    assert(count <= room());
-    const auto index = static_cast<std::uint32_t>(size_);
+    reserve(count);
     size_ += count;
-    return index;
+    return static_cast<std::uint32_t>(size_ - count);
 }
 
 void EdgeStore::closeBase(const Edge& root) {

@@ -39,6 +39,23 @@ inline std::uint32_t LetterBit(char letter) {
     return 1U << (letter - 'a');
 }
 
+#if defined(__x86_64__)
+template <class Walk>
+[[gnu::target("popcnt"), gnu::flatten]] auto ByInstruction(const Walk& walk) {
+    return walk();
+}
+#endif
+
+/// Walks count the letters before theirs at every step: they are compiled a second time for
+/// processors that have an instruction for it.
+template <class Walk>
+auto CountingBits(const Walk& walk) {
+#if defined(__x86_64__)
+    if (__builtin_cpu_supports("popcnt")) return ByInstruction(walk);
+#endif
+    return walk();
+}
+
 /// How many words go on from the edge.
 std::uint32_t CountWords(const Edge* edges, const Edge& edge);
 
@@ -55,8 +72,8 @@ class EdgeStore {
 
     /// Makes room for `count` more edges. Throws std::bad_alloc; the content stays.
     void reserve(std::size_t count);
-    std::size_t room() const { return capacity_ - size_; }
-    /// Appends `count` edges, not yet written, of the room reserved, and returns their index.
+    /// Appends `count` edges, not yet written, and returns their index. Throws std::bad_alloc when
+    /// there is no room.
     std::uint32_t append(std::size_t count);
     /// Ends the base, which nothing is added to from now on, and gives back the room left.
     void closeBase(const Edge& root);

@@ -66,7 +66,7 @@ WordGraph GraphBuilder::finish() {
     return finish(store(path_[0]));
 }
 
-WordGraph GraphBuilder::finish(const StoredNode& root) {
+WordGraph GraphBuilder::finish(const Edge& root) {
     edges_->closeBase({root.letters, root.first});
     return WordGraph(std::move(edges_));
 }
@@ -92,14 +92,13 @@ void GraphBuilder::closeNodes(std::size_t depth) {
     }
 }
 
-StoredNode GraphBuilder::store(const OpenNode& open) {
+Edge GraphBuilder::store(const OpenNode& open) {
     if (open.letters == 0) return {};
     const std::uint64_t hash = Hash(open);
     for (auto table = tables_.rbegin(); !open.isNew && table != tables_.rend(); ++table) {
         const std::uint32_t first = table->find(open, hash, edges_->edges());
         if (first != 0) return {open.letters, first, open.words};
     }
-    if (edges_->room() < open.count) edges_->reserve(edges_->size() / 2 + Letters);
     const std::uint32_t first = edges_->append(open.count);
     std::copy_n(open.edges.data(), open.count, edges_->edges() + first);
     if (tables_.back().room == 0) tables_.emplace_back(4 * (tables_.back().last + 1));

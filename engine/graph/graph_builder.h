@@ -10,13 +10,6 @@
 
 namespace Quorle {
 
-/// A node in the store: what an edge says of it, and the words that go on from it.
-struct StoredNode {
-    std::uint32_t letters = 0;
-    std::uint32_t first = 0;
-    std::uint32_t words = 0;
-};
-
 /// A node that is still open for more letters.
 struct OpenNode {
     std::uint32_t letters = 0;
@@ -40,11 +33,11 @@ struct OpenNode {
         edges[count - 1].letters |= WordEnds;
         edges[count - 1].before = ++words;
     }
-    /// The last letter leads to the node.
-    void lead(const StoredNode& node) {
+    /// The last letter leads to a stored node.
+    void lead(const Edge& node) {
         edges[count - 1].letters |= node.letters;
         edges[count - 1].first = node.first;
-        words += node.words;
+        words += node.before;
     }
 };
 
@@ -63,10 +56,11 @@ class GraphBuilder {
     /// there is no more.
     bool giveBack();
 
-    /// Instead of words, nodes can be stored one by one, children first.
-    StoredNode store(const OpenNode& open);
+    /// Instead of words, nodes can be stored one by one, children first. Gives what an edge says
+    /// of the node, and as its words before those that go on from it.
+    Edge store(const OpenNode& open);
     /// The graph of a node stored, or of none.
-    WordGraph finish(const StoredNode& root);
+    WordGraph finish(const Edge& root);
 
   private:
     // Where stored nodes are found by their edges: a hash table with open addressing.

@@ -22,10 +22,10 @@ class Copier {
   private:
     // The node with the words of at most so many letters. A node that is cut at several places
     // becomes several nodes; where nothing is cut off, the place makes no difference.
-    StoredNode copyNode(const Edge& to, std::size_t letters) {
+    Edge copyNode(const Edge& to, std::size_t letters) {
         if (letters == 0 || to.next() == 0) return {};
         if (letters >= height(to)) {
-            StoredNode& whole = whole_[to.first];
+            Edge& whole = whole_[to.first];
             if (whole.letters == 0) whole = copyEdges(to, letters);
             return whole;
         }
@@ -34,11 +34,11 @@ class Copier {
         return cut->second;
     }
 
-    StoredNode copyEdges(const Edge& to, std::size_t letters) {
+    Edge copyEdges(const Edge& to, std::size_t letters) {
         OpenNode open;
         const Edge* edge = edges_ + to.first;
         for (std::uint32_t left = to.next(); left != 0; left &= left - 1, ++edge) {
-            const StoredNode child = copyNode(*edge, letters - 1);
+            const Edge child = copyNode(*edge, letters - 1);
             if (child.letters == 0 && !edge->isWord()) continue;
             open.open(left & -left);
             if (edge->isWord()) open.endWord();
@@ -62,8 +62,8 @@ class Copier {
     GraphBuilder builder_;
     // Of nodes, by their first edge.
     std::vector<std::uint8_t> heights_;
-    std::vector<StoredNode> whole_;
-    std::unordered_map<std::uint64_t, StoredNode> cut_;  // and by the letters left
+    std::vector<Edge> whole_;
+    std::unordered_map<std::uint64_t, Edge> cut_;  // and by the letters left
 };
 
 }  // namespace

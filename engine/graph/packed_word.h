@@ -15,6 +15,9 @@ inline constexpr std::size_t LongestWord = 16;
 /// last. Numbers and words have the same order.
 __extension__ using PackedWord = unsigned __int128;
 
+/// After every word.
+inline constexpr PackedWord NoWord = ~PackedWord{0};
+
 /// A letter (0 "a" .. 25 "z") as that of a word's place, 0..15.
 inline PackedWord PackedLetter(int letter, std::size_t place) {
     return PackedWord{static_cast<unsigned>('a' + letter)} << 8 * (LongestWord - 1 - place);

@@ -26,21 +26,21 @@ class WordCursor {
         }
     }
 
-    /// The next word; false at the end, and from then on.
-    bool next(PackedWord& word) {
+    /// The next word; NoWord at the end, and from then on.
+    PackedWord next() {
         const Edge* const edges = graph_.edges();
         while (true) {
             Step& step = steps_[depth_];
             if (step.left == 0) {
-                if (depth_ == top_) return false;
+                if (depth_ == top_) return NoWord;
                 --depth_;
                 continue;
             }
             const Edge& edge = edges[step.edge++];
-            word = step.word | PackedLetter(std::countr_zero(step.left), depth_);
+            const PackedWord word = step.word | PackedLetter(std::countr_zero(step.left), depth_);
             step.left &= step.left - 1;
             steps_[++depth_] = {edge.first, edge.next(), word};
-            if (edge.isWord()) return true;
+            if (edge.isWord()) return word;
         }
     }
 

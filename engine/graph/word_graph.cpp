@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <utility>
 
-#include "graph/bit_count.h"
 #include "graph/packed_word.h"
 
 // An edit walks the base graph beside the current one. A node that has become like the base node
@@ -29,95 +28,90 @@ class Edit {
   public:
     explicit Edit(EdgeStore& store) : store_(store), edges_(store.edges()) {}
 
-    void toggle(Edge& root, std::string_view word, std::uint32_t change);
+    // Down the path nodes are copied, and the words behind it counted anew, by one more or less; up
+    // again the edges are left out that lead nowhere, and nodes that the base has as well.
+    void toggle(Edge& root, std::string_view word, std::uint32_t change) {
+        std::array<Step, LongestWord + 1> path;
+        Step* step = path.data();
+        *step = {&root, edges_};
+        for (const char letter : word) {
+            const std::uint32_t bit = LetterBit(letter);
+            own(*step->edge, bit);
+            Edge* const edge = edges_ + step->edge->at(bit);
+            Edge* const end = edges_ + step->edge->first + step->edge->count();
+            for (Edge* later = edge + 1; later < end; ++later) later->before += change;
+            const Edge& base = *step->base;
+            *++step = {edge, (base.letters & bit) != 0 ? edges_ + base.at(bit) : &Nowhere};
+        }
+        step->edge->letters ^= WordEnds;
+        step->edge->before += change;
+        for (bool goOn = true; goOn && step != path.data();) {
+            const Edge* const edge = step->edge;
+            --step;
+            goOn = edge->letters == 0;
+            if (goOn)
+                leaveOut(*step->edge,
+                         LetterBit(word[static_cast<std::size_t>(step - path.data())]));
+            if (joinBase(*step->edge, *step->base)) goOn = true;
+        }
+    }
 
   private:
-    void own(Edge& to, std::uint32_t bit);
-    void leaveOut(Edge& from, std::uint32_t bit);
-    bool joinBase(Edge& edge, const Edge& base);
+    // Leads the edge to a node that nothing else leads to, with an edge for the letter.
+    void own(Edge& to, std::uint32_t bit) {
+        const bool hasEdge = (to.letters & bit) != 0;
+        const bool isEdited = store_.isEdited(to.first);
+        const bool isShared = !isEdited || store_.references(to.first) > 1;
+        if (hasEdge && !isShared) return;
+        const std::uint32_t count = to.count();
+        const std::uint32_t place = to.at(bit) - to.first;
+        const Edge* const from = edges_ + to.first;
+        const std::uint32_t first = store_.allocate(hasEdge ? count : count + 1);
+        Edge* copy = std::copy_n(from, place, edges_ + first);
+        if (!hasEdge) {
+            const std::uint32_t before = place == count
+                                             ? CountWords(edges_, to)
+                                             : from[place].before - (from[place].isWord() ? 1 : 0);
+            *copy++ = {0, 0, before};
+        }
+        std::copy_n(from + place, count - place, copy);
+        if (isEdited && isShared) {
+            std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
+            store_.release(to);
+        } else if (isEdited) {
+            store_.free(to.first, count);
+        }
+        to.first = first;
+        to.letters |= bit;
+    }
+
+    // Takes the letter's edge, which leads nowhere, out of the owned node.
+    void leaveOut(Edge& from, std::uint32_t bit) {
+        const std::uint32_t count = from.count();
+        const std::uint32_t place = from.at(bit) - from.first;
+        const std::uint32_t old = from.first;
+        from.letters ^= bit;
+        from.first = count == 1 ? 0 : store_.allocate(count - 1);
+        if (count > 1) {
+            Edge* const to = std::copy_n(edges_ + old, place, edges_ + from.first);
+            std::copy_n(edges_ + old + place + 1, count - place - 1, to);
+        }
+        store_.free(old, count);
+    }
+
+    bool joinBase(Edge& edge, const Edge& base) {
+        if (edge.next() != base.next()) return false;
+        const std::uint32_t count = edge.count();
+        const Edge* const own = edges_ + edge.first;
+        if (!std::equal(own, own + count, edges_ + base.first)) return false;
+        if (count > 0) store_.free(edge.first, count);
+        edge.first = base.first;
+        return true;
+    }
 
     EdgeStore& store_;
     Edge* const edges_;
 };
-
-// Down the path nodes are copied, and the words behind it counted anew, by one more or less; up
-// again the edges are left out that lead nowhere, and nodes that the base has as well.
-void Edit::toggle(Edge& root, std::string_view word, std::uint32_t change) {
-    std::array<Step, LongestWord + 1> path;
-    Step* step = path.data();
-    *step = {&root, edges_};
-    for (const char letter : word) {
-        const std::uint32_t bit = LetterBit(letter);
-        own(*step->edge, bit);
-        Edge* const edge = edges_ + step->edge->at(bit);
-        Edge* const end = edges_ + step->edge->first + step->edge->count();
-        for (Edge* later = edge + 1; later < end; ++later) later->before += change;
-        const Edge& base = *step->base;
-        *++step = {edge, (base.letters & bit) != 0 ? edges_ + base.at(bit) : &Nowhere};
-    }
-    step->edge->letters ^= WordEnds;
-    step->edge->before += change;
-    for (bool goOn = true; goOn && step != path.data();) {
-        const Edge* const edge = step->edge;
-        --step;
-        goOn = edge->letters == 0;
-        if (goOn)
-            leaveOut(*step->edge, LetterBit(word[static_cast<std::size_t>(step - path.data())]));
-        if (joinBase(*step->edge, *step->base)) goOn = true;
-    }
-}
-
-// Leads the edge to a node that nothing else leads to, with an edge for the letter.
-void Edit::own(Edge& to, std::uint32_t bit) {
-    const bool hasEdge = (to.letters & bit) != 0;
-    const bool isEdited = store_.isEdited(to.first);
-    const bool isShared = !isEdited || store_.references(to.first) > 1;
-    if (hasEdge && !isShared) return;
-    const std::uint32_t count = to.count();
-    const std::uint32_t place = to.at(bit) - to.first;
-    const Edge* const from = edges_ + to.first;
-    const std::uint32_t first = store_.allocate(hasEdge ? count : count + 1);
-    Edge* copy = std::copy_n(from, place, edges_ + first);
-    if (!hasEdge) {
-        const std::uint32_t before = place == count
-                                         ? CountWords(edges_, to)
-                                         : from[place].before - (from[place].isWord() ? 1 : 0);
-        *copy++ = {0, 0, before};
-    }
-    std::copy_n(from + place, count - place, copy);
-    if (isEdited && isShared) {
-        std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
-        store_.release(to);
-    } else if (isEdited) {
-        store_.free(to.first, count);
-    }
-    to.first = first;
-    to.letters |= bit;
-}
-
-// Takes the letter's edge, which leads nowhere, out of the owned node.
-void Edit::leaveOut(Edge& from, std::uint32_t bit) {
-    const std::uint32_t count = from.count();
-    const std::uint32_t place = from.at(bit) - from.first;
-    const std::uint32_t old = from.first;
-    from.letters ^= bit;
-    from.first = count == 1 ? 0 : store_.allocate(count - 1);
-    if (count > 1) {
-        Edge* const to = std::copy_n(edges_ + old, place, edges_ + from.first);
-        std::copy_n(edges_ + old + place + 1, count - place - 1, to);
-    }
-    store_.free(old, count);
-}
-
-bool Edit::joinBase(Edge& edge, const Edge& base) {
-    if (edge.next() != base.next()) return false;
-    const std::uint32_t count = edge.count();
-    const Edge* const own = edges_ + edge.first;
-    if (!std::equal(own, own + count, edges_ + base.first)) return false;
-    if (count > 0) store_.free(edge.first, count);
-    edge.first = base.first;
-    return true;
-}
 
 }  // namespace
 
@@ -130,11 +124,6 @@ WordGraph::WordGraph(const WordGraph& other)
     : store_(other.store_), root_(other.root_), size_(other.size_) {
     if (store_) store_->hold(root_);
 }
-
-WordGraph::WordGraph(WordGraph&& other) noexcept
-    : store_(std::move(other.store_)),
-      root_(std::exchange(other.root_, {})),
-      size_(std::exchange(other.size_, 0)) {}
 
 WordGraph& WordGraph::operator=(WordGraph other) noexcept {
     std::swap(store_, other.store_);

@@ -15,7 +15,6 @@ class WordGraph {
     /// The base of a finished store.
     explicit WordGraph(std::shared_ptr<EdgeStore> store);
     WordGraph(const WordGraph& other);
-    WordGraph(WordGraph&& other) noexcept;
     WordGraph& operator=(WordGraph other) noexcept;
     ~WordGraph();
 

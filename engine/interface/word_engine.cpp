@@ -101,7 +101,7 @@ bool Save(const char* path, std::span<const std::byte> content) {
 std::string WordsAsText(const WordGraph& words) {
     std::string text;
     WordCursor cursor(words);
-    for (PackedWord word = 0; cursor.next(word);) {
+    for (PackedWord word = cursor.next(); word != NoWord; word = cursor.next()) {
         char letters[LongestWord];
         WriteLetters(word, LengthOf(word), letters);
         text.append(letters, LengthOf(word)).push_back('\n');
@@ -186,8 +186,8 @@ int32_t cStartDecodingWords(int32_t first, int32_t second) {
 }
 
 int16_t cDecodeNextWord(char* buffer) {
-    PackedWord word = 0;
-    if (buffer == nullptr || !State.listing.next(word)) return 0;
+    const PackedWord word = buffer == nullptr ? NoWord : State.listing.next();
+    if (word == NoWord) return 0;
     const std::size_t length = LengthOf(word);
     WriteLetters(word, length, buffer);
     return static_cast<int16_t>(length);

@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <cstring>
 
-#include "graph/bit_count.h"
 #include "search/letter_match.h"
 
 // All chains of as many letters are a level, and are extended together, so that their edges are

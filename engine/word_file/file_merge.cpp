@@ -12,7 +12,6 @@ constexpr std::size_t BlockSize = std::size_t{16} << 10;
 // Of a token that lies across blocks no more is kept: it is no word, however it goes on.
 constexpr std::size_t MostKept = LongestWord + 1;
 constexpr std::size_t WordsAtOnce = 256;
-constexpr PackedWord AtEnd = ~PackedWord{0};
 constexpr double ReadingShare = 0.4;  // of the time; the rest is building
 
 // Someone who changes the dictionary at every step must not keep the merge from ending: the last
@@ -34,7 +33,9 @@ FileMerge::FileMerge(Dictionary& dictionary, const char* path)
 bool FileMerge::work() {
     if (!build_) return readOn();
     if (isIn_) return build_->builder.giveBack();
-    if (!build_->isOf(dictionary_)) return beginAnew();
+    const bool isUpToDate =
+        dictionary_.words() == build_->base && dictionary_.limits.longest == build_->longest;
+    if (!isUpToDate) return beginAnew();
     isIn_ = !addWords();
     if (isIn_) dictionary_.replace(build_->builder.finish());
     return true;
@@ -71,9 +72,7 @@ bool FileMerge::readOn() {
         takeWords();
     }
     words_.finish();
-    build_ = std::make_unique<Build>(dictionary_, words_.size());
-    nextHeld();
-    nextFresh();
+    build_ = std::make_unique<Build>(dictionary_, words_);
     return true;
 }
 
@@ -87,35 +86,24 @@ void FileMerge::takeWords() {
     std::copy_n(token, used_, text_.data());
 }
 
-FileMerge::Build::Build(const Dictionary& dictionary, std::size_t newWords)
+FileMerge::Build::Build(const Dictionary& dictionary, SortedWords& words)
     : base(dictionary.words()),
       longest(dictionary.limits.longest),
       cursor(base),
-      builder(base.edgesEnd() + newWords) {}
-
-bool FileMerge::Build::isOf(const Dictionary& dictionary) const {
-    return dictionary.words() == base && dictionary.limits.longest == longest;
-}
-
-void FileMerge::nextHeld() {
-    if (!build_->cursor.next(build_->held)) build_->held = AtEnd;
-}
-
-void FileMerge::nextFresh() {
-    PackedWord& fresh = build_->fresh;
-    do {
-        if (!words_.next(fresh)) fresh = AtEnd;
-    } while (fresh != AtEnd && LengthOf(fresh) > static_cast<std::size_t>(build_->longest));
-}
+      builder(base.edgesEnd() + words.size()),
+      held(cursor.next()),
+      fresh(words.next()) {}
 
 /// False when all words are in.
 bool FileMerge::addWords() {
-    for (std::size_t i = 0; i < WordsAtOnce; ++i, ++build_->added) {
-        const PackedWord word = std::min(build_->held, build_->fresh);
-        if (word == AtEnd) return false;
-        build_->builder.add(word);
-        if (build_->held == word) nextHeld();
-        if (build_->fresh == word) nextFresh();
+    Build& build = *build_;
+    const auto longest = static_cast<std::size_t>(build.longest);
+    for (std::size_t i = 0; i < WordsAtOnce; ++i, ++build.added) {
+        const PackedWord word = std::min(build.held, build.fresh);
+        if (word == NoWord) return false;
+        if (word == build.held || LengthOf(word) <= longest) build.builder.add(word);
+        if (word == build.fresh) build.fresh = words_.next();
+        if (word == build.held) build.held = build.cursor.next();
     }
     return true;
 }

@@ -28,22 +28,19 @@ class FileMerge {
   private:
     /// What the merged dictionary is made of.
     struct Build {
-        Build(const Dictionary& dictionary, std::size_t newWords);
-        bool isOf(const Dictionary& dictionary) const;
+        Build(const Dictionary& dictionary, SortedWords& words);
 
         const WordGraph base;
         const std::int32_t longest;
         WordCursor cursor;
         GraphBuilder builder;
-        PackedWord held = 0;   // the next word of the base, AtEnd behind the last
-        PackedWord fresh = 0;  // the next one of the file
+        PackedWord held;   // the next word of the base
+        PackedWord fresh;  // the next one of the file
         std::size_t added = 0;
     };
 
     bool readOn();
     void takeWords();
-    void nextHeld();
-    void nextFresh();
     bool addWords();
     bool beginAnew();
 

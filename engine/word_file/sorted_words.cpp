@@ -13,12 +13,14 @@ void SortedWords::endChunk() {
     chunk_.reserve(ChunkSize);
 }
 
+SortedWords::Head SortedWords::headOf(Run& run) {
+    const Chunk& chunk = run.front();
+    return {chunk.front(), chunk.data(), chunk.data() + chunk.size(), &run};
+}
+
 void SortedWords::finish() {
     if (!chunk_.empty()) endChunk();
-    for (Chunks& run : runs_) {
-        const std::vector<PackedWord>& first = run.front();
-        heads_.push_back({first.front(), first.data(), first.data() + first.size(), &run});
-    }
+    for (Run& run : runs_) heads_.push_back(headOf(run));
     for (std::size_t place = heads_.size() / 2; place-- > 0;) sink(place);
 }
 
@@ -36,27 +38,26 @@ void SortedWords::sink(std::size_t place) {
 
 /// False at the end of the run.
 bool SortedWords::advance(Head& head) {
-    if (++head.at == head.chunkEnd) {
-        head.chunks->pop_front();
-        if (head.chunks->empty()) return false;
-        head.at = head.chunks->front().data();
-        head.chunkEnd = head.at + head.chunks->front().size();
+    if (++head.at != head.chunkEnd) {
+        head.word = *head.at;
+        return true;
     }
-    head.word = *head.at;
-    return true;
+    head.run->pop_front();
+    if (!head.run->empty()) head = headOf(*head.run);
+    return !head.run->empty();
 }
 
-bool SortedWords::next(PackedWord& word) {
+PackedWord SortedWords::next() {
     while (!heads_.empty()) {
-        word = heads_.front().word;
+        const PackedWord word = heads_.front().word;
         if (!advance(heads_.front())) {
             heads_.front() = heads_.back();
             heads_.pop_back();
         }
         if (heads_.size() > 1) sink(0);
-        if (std::exchange(last_, word) != word) return true;
+        if (std::exchange(last_, word) != word) return word;
     }
-    return false;
+    return NoWord;
 }
 
 }  // namespace Quorle

@@ -20,28 +20,30 @@ class SortedWords {
     /// Not fewer than there are different words.
     std::size_t size() const { return size_; }
 
-    /// Once they are in: the next word, strictly ascending; false at the end. Memory is given back
+    /// Once they are in: the next word, strictly ascending; NoWord at the end. Memory is given back
     /// as words are taken out, for at once it would take long.
-    bool next(PackedWord& word);
+    PackedWord next();
 
   private:
     static constexpr std::size_t ChunkSize = 4096;
 
-    using Chunks = std::deque<std::vector<PackedWord>>;
+    using Chunk = std::vector<PackedWord>;
+    using Run = std::deque<Chunk>;
     /// A run by its next word.
     struct Head {
         PackedWord word;
         const PackedWord* at;
         const PackedWord* chunkEnd;
-        Chunks* chunks;
+        Run* run;
     };
 
+    static Head headOf(Run& run);
     static bool advance(Head& head);
     void endChunk();
     void sink(std::size_t place);
 
-    std::vector<PackedWord> chunk_;
-    std::deque<Chunks> runs_;
+    Chunk chunk_;
+    std::deque<Run> runs_;
     std::vector<Head> heads_;  // a heap, the smallest word first
     std::size_t size_ = 0;
     PackedWord last_ = 0;
