@@ -24,11 +24,13 @@ class Dictionary {
             for (char second = 'a'; second <= 'z'; ++second) renew(first, second);
         }
     }
-    /// As of WordGraph; words of 2 letters and more.
-    bool set(std::string_view word, bool isHeld) {
-        const bool changed = words_.set(word, isHeld);
-        if (changed) renew(word[0], word[1]);
-        return changed;
+    /// Adds a word of 2 to 16 letters, or removes it; false when it is held, or not, already.
+    /// Throws std::bad_alloc and changes nothing.
+    bool set(const char* word, bool isHeld) {
+        if ((lookUp(word) >= WordEnds) == isHeld) return false;
+        words_.set(word, isHeld);
+        renew(word[0], word[1]);
+        return true;
     }
 
     /// Follows a text, which may hold anything: what an edge says of the letters that words go on

@@ -60,27 +60,20 @@ class Edit {
     // Leads the edge to a node that nothing else leads to, with an edge for the letter.
     void own(Edge& to, std::uint32_t bit) {
         const bool hasEdge = (to.letters & bit) != 0;
-        const bool isEdited = store_.isEdited(to.first);
-        const bool isShared = !isEdited || store_.references(to.first) > 1;
-        if (hasEdge && !isShared) return;
+        if (hasEdge && store_.isEdited(to.first) && store_.references(to.first) == 1) return;
         const std::uint32_t count = to.count();
         const std::uint32_t place = to.at(bit) - to.first;
         const Edge* const from = edges_ + to.first;
         const std::uint32_t first = store_.allocate(hasEdge ? count : count + 1);
         Edge* copy = std::copy_n(from, place, edges_ + first);
         if (!hasEdge) {
-            const std::uint32_t before = place == count
-                                             ? CountWords(edges_, to)
-                                             : from[place].before - (from[place].isWord() ? 1 : 0);
-            *copy++ = {0, 0, before};
+            const bool isLast = place == count;
+            const std::uint32_t wordsBefore = from[place].before - (from[place].isWord() ? 1 : 0);
+            *copy++ = {0, 0, isLast ? CountWords(edges_, to) : wordsBefore};
         }
         std::copy_n(from + place, count - place, copy);
-        if (isEdited && isShared) {
-            std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
-            store_.release(to);
-        } else if (isEdited) {
-            store_.free(to.first, count);
-        }
+        std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
+        store_.release(to);
         to.first = first;
         to.letters |= bit;
     }
@@ -150,15 +143,13 @@ Edge WordGraph::find(std::string_view letters) const {
 }
 
 // All memory that an edit can need is asked for before it begins, so that it cannot fail halfway.
-bool WordGraph::set(std::string_view word, bool isHeld) {
-    assert(!word.empty() && word.size() <= LongestWord);
-    if (find(word).isWord() == isHeld) return false;
+void WordGraph::set(std::string_view word, bool isHeld) {
+    assert(!word.empty() && word.size() <= LongestWord && find(word).isWord() != isHeld);
     if (!store_) store_ = std::make_shared<EdgeStore>();
     store_->reserve(MostEditedEdges);
     const std::uint32_t change = isHeld ? 1 : ~0U;
     CountingBits([&] { Edit(*store_).toggle(root_, word, change); });
     size_ += change;
-    return true;
 }
 
 }  // namespace Quorle

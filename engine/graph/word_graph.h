@@ -24,9 +24,9 @@ class WordGraph {
     /// Without letters and no word when no word begins so.
     Edge find(std::string_view letters) const;
 
-    /// Adds a word, or removes it; false when it is held, or not, already. Copies only the nodes
-    /// on its path. Throws std::bad_alloc and changes nothing.
-    bool set(std::string_view word, bool isHeld);
+    /// Adds a word that is not held, or removes one that is. Copies only the nodes on its path.
+    /// Throws std::bad_alloc and changes nothing.
+    void set(std::string_view word, bool isHeld);
 
     /// Whether no smaller graph spells the same words: true until an edit.
     bool isMinimal() const { return !store_ || root_ == store_->edges()[0]; }

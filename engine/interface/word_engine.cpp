@@ -22,7 +22,6 @@ struct EngineState {
     Dictionary dictionary;
     WordCursor listing;
     std::unique_ptr<BoardSearch> search;  // made by the first one
-    Board board{};                        // of the last one
     FoundWords found;
     MergeLine merges{dictionary};
     std::set<std::string> unreadable;  // dictionary files, by their path without links
@@ -40,26 +39,16 @@ Result Guarded(Result nothing, const Work& work) {
     }
 }
 
-bool IsLetters(std::string_view text) {
-    return std::all_of(text.begin(), text.end(), [](char c) { return c >= 'a' && c <= 'z'; });
-}
-
-/// At most 17 characters, so that a text without end is not read.
-std::string_view Beginning(const char* text) {
-    std::size_t size = 0;
-    while (size <= LongestWord && text[size] != 0) ++size;
-    return {text, size};
-}
-
 bool IsWordSize(std::int32_t size) {
     return size >= 2 && size <= std::int32_t{LongestWord};
 }
 
-/// A word of 2 to 16 letters; empty when it is none.
+/// A text of 2 to 16 letters; empty when it is none. A text without end is not read on.
 std::string_view Word(const char* text) {
-    const std::string_view word = text == nullptr ? "" : Beginning(text);
-    const bool isWord = IsWordSize(static_cast<std::int32_t>(word.size())) && IsLetters(word);
-    return isWord ? word : "";
+    std::size_t size = 0;
+    while (text != nullptr && size <= LongestWord && text[size] >= 'a' && text[size] <= 'z') ++size;
+    const bool isWord = IsWordSize(static_cast<std::int32_t>(size)) && text[size] == 0;
+    return isWord ? std::string_view(text, size) : "";
 }
 
 /// Two letters by their numbers; empty when there are no such letters.
@@ -109,15 +98,15 @@ std::string WordsAsText(const WordGraph& words) {
     return text;
 }
 
-/// Finds the words on a board that is 16 letters.
 void SearchBoard(std::string_view letters) {
-    std::copy(letters.begin(), letters.end(), State.board.begin());
+    Board board;
+    std::copy(letters.begin(), letters.end(), board.begin());
     if (!State.search) {
         const bool isWide = CanMatch(Matching::Avx2);
         State.search = std::make_unique<BoardSearch>(isWide ? Matching::Avx2 : Matching::Plain);
     }
     const Dictionary& dictionary = State.dictionary;
-    State.search->search(dictionary.words(), State.board, dictionary.limits, State.found);
+    State.search->search(dictionary.words(), board, dictionary.limits, State.found);
 }
 
 }  // namespace
@@ -150,16 +139,14 @@ int32_t cDictionaryAdd(const char* text) {
         const std::string_view word = Word(text);
         const auto longest = static_cast<std::size_t>(State.dictionary.limits.longest);
         if (word.empty() || word.size() > longest) return 0;
-        State.dictionary.set(word, true);
+        State.dictionary.set(text, true);
         return 1;
     });
 }
 
 int32_t cDictionaryRemove(const char* text) {
-    return Guarded(0, [&] {
-        const std::string_view word = Word(text);
-        return !word.empty() && State.dictionary.set(word, false) ? 1 : 0;
-    });
+    return Guarded(
+        0, [&] { return !Word(text).empty() && State.dictionary.set(text, false) ? 1 : 0; });
 }
 
 int32_t cDictionaryClear(void) {
@@ -207,9 +194,8 @@ int32_t cWriteTextFile(const char* path) {
 
 int32_t cCheckForAllDefinedWords(const char* board) {
     const bool isFound = Guarded(false, [&] {
-        const std::string_view letters = board == nullptr ? "" : Beginning(board);
-        const bool isBoard = letters.size() == Cubes && IsLetters(letters);
-        if (isBoard) SearchBoard(letters);
+        const bool isBoard = Word(board).size() == Cubes;
+        if (isBoard) SearchBoard(Word(board));
         return isBoard;
     });
     if (!isFound) State.found.clear();
@@ -219,11 +205,10 @@ int32_t cCheckForAllDefinedWords(const char* board) {
 int32_t cGetDefinedWord(int32_t i, char* buffer, int32_t* n) {
     if (n == nullptr) return 0;
     *n = 0;
-    FoundWords& found = State.found;
-    if (buffer == nullptr || i < 0 || static_cast<std::size_t>(i) >= found.size()) return 0;
     return Guarded(0, [&] {
-        if (!found.isFinished()) found.finish(State.board);
-        *n = static_cast<int32_t>(found.spell(static_cast<std::size_t>(i), buffer));
+        const auto index = static_cast<std::size_t>(i);
+        if (buffer == nullptr || i < 0 || index >= State.found.size()) return 0;
+        *n = static_cast<int32_t>(State.found.spell(index, buffer));
         return 1;
     });
 }

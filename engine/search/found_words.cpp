@@ -15,10 +15,15 @@ constexpr std::size_t ManyWords = 300;
 
 }  // namespace
 
-void FoundWords::clear(std::size_t dictionary) {
+void FoundWords::clear() {
     for (std::size_t i = 0; i < size_; ++i) known_[words_[i].number / 64] = 0;
     size_ = 0;
     isFinished_ = false;
+}
+
+void FoundWords::begin(std::size_t dictionary, const Board& board) {
+    clear();
+    board_ = board;
     if (dictionary < knownSize_) return;
     known_ = TakeZeroed<std::uint64_t>(dictionary / 64 + 1);
     knownSize_ = dictionary + 1;
@@ -67,18 +72,20 @@ void FoundWords::sortByDigits() {
     }
 }
 
-void FoundWords::finish(const Board& board) {
+/// Puts the words in order, and gets ready to spell them.
+void FoundWords::finish() {
     size_ >= ManyWords ? sortByDigits<ManyBits>() : sortByDigits<FewBits>();
     std::uint16_t* pair = pairs_.data();
-    for (const char first : board) {
-        for (const char second : board) *pair++ = static_cast<std::uint16_t>(first << 8 | second);
+    for (const char first : board_) {
+        for (const char second : board_) *pair++ = static_cast<std::uint16_t>(first << 8 | second);
     }
-    hasQu_ = std::find(board.begin(), board.end(), 'q') != board.end();
+    hasQu_ = std::find(board_.begin(), board_.end(), 'q') != board_.end();
     isFinished_ = true;
 }
 
 // Words of up to eight letters, nearly all there are, are put together two cubes at a time.
-std::size_t FoundWords::spell(std::size_t i, char* to) const {
+std::size_t FoundWords::spell(std::size_t i, char* to) {
+    if (!isFinished_) finish();
     const std::size_t letters = words_[i].letters;
     const std::uint64_t path = words_[i].path << 4 * (LongestWord - letters);
     const auto four = [&](unsigned shift) {

@@ -23,21 +23,21 @@ class FoundWords {
         return (known_[number / 64] >> number % 64 & 1) != 0;
     }
 
-    /// No words. Those that come are of a dictionary of so many. Throws std::bad_alloc.
-    void clear(std::size_t dictionary = 0);
+    void clear();
+    /// No words: those that come are of a dictionary of so many, and on a board. Throws
+    /// std::bad_alloc.
+    void begin(std::size_t dictionary, const Board& board);
     /// Where so many words can be written behind those there are. Throws std::bad_alloc.
     FoundWord* room(std::size_t most);
     /// Takes in the words written there up to `end` that are new: all of so many letters.
     void take(const FoundWord* end, std::uint32_t letters);
 
-    /// Once all are in: puts them in alphabetical order, to be spelled by the board's letters.
-    /// Throws std::bad_alloc.
-    void finish(const Board& board);
-    bool isFinished() const { return isFinished_; }
-    /// Writes the letters of the word of index `i`, and returns how many.
-    std::size_t spell(std::size_t i, char* to) const;
+    /// Once all are in: writes the letters of the word of index `i`, in alphabetical order, and
+    /// returns how many. Throws std::bad_alloc.
+    std::size_t spell(std::size_t i, char* to);
 
   private:
+    void finish();
     template <unsigned DigitBits>
     void sortByDigits();
 
@@ -46,6 +46,7 @@ class FoundWords {
     std::size_t size_ = 0;
     ZeroedMemory<std::uint64_t> known_;  // a bit for each word of the dictionary
     std::size_t knownSize_ = 0;
+    Board board_{};
     bool isFinished_ = false;
     // The letters of each two cubes, the first in the higher byte.
     std::array<std::uint16_t, std::size_t{Cubes} * Cubes> pairs_;
