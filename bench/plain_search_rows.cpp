@@ -22,7 +22,6 @@ class PlainSearch {
         Board board{};
         std::copy(letters.begin(), letters.end(), board.begin());
         search_->search(content_.words, board, {}, found_);
-        found_.finish(board);
         for (std::size_t i = 0; i < found_.size(); ++i) {
             char text[LongestWord];
             take(std::string_view(text, found_.spell(i, text)));

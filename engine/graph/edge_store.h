@@ -33,6 +33,8 @@ struct alignas(16) Edge {
     }
 };
 
+inline constexpr Edge Nowhere;
+
 /// The bit of a lower-case letter.
 inline std::uint32_t LetterBit(char letter) {
     assert(letter >= 'a' && letter <= 'z');

@@ -76,7 +76,7 @@ inline void WriteLetters(PackedWord word, std::size_t length, char* to) {
     if (length >= 4) {
         write(__builtin_bswap32(static_cast<std::uint32_t>(high >> 32)),
               __builtin_bswap32(static_cast<std::uint32_t>(end)));
-    } else {
+    } else if (length >= 2) {
         write(__builtin_bswap16(static_cast<std::uint16_t>(high >> 48)),
               __builtin_bswap16(static_cast<std::uint16_t>(end)));
     }

@@ -16,8 +16,6 @@ namespace {
 // The most edges that one edit appends: each node on the path, with one edge more.
 constexpr std::size_t MostEditedEdges = LongestWord * (2 + std::size_t{Letters});
 
-constexpr Edge Nowhere;
-
 /// An edge of the edited word's path, and the base edge of the same letters.
 struct Step {
     Edge* edge;
@@ -109,29 +107,11 @@ class Edit {
 }  // namespace
 
 WordGraph::WordGraph(std::shared_ptr<EdgeStore> store)
-    : store_(std::move(store)),
-      root_(store_->edges()[0]),
-      size_(CountWords(store_->edges(), root_)) {}
-
-WordGraph::WordGraph(const WordGraph& other)
-    : store_(other.store_), root_(other.root_), size_(other.size_) {
-    if (store_) store_->hold(root_);
-}
-
-WordGraph& WordGraph::operator=(WordGraph other) noexcept {
-    std::swap(store_, other.store_);
-    std::swap(root_, other.root_);
-    std::swap(size_, other.size_);
-    return *this;
-}
-
-WordGraph::~WordGraph() {
-    if (store_) store_->release(root_);
-}
+    : place_(new Place{store, store->edges()[0]}), size_(CountWords(store->edges(), root())) {}
 
 Edge WordGraph::find(std::string_view letters) const {
     return CountingBits([&] {
-        Edge place = root_;
+        Edge place = root();
         for (const char letter : letters) {
             const std::uint32_t bit = LetterBit(letter);
             if ((place.letters & bit) == 0) return Edge{};
@@ -145,10 +125,14 @@ Edge WordGraph::find(std::string_view letters) const {
 // All memory that an edit can need is asked for before it begins, so that it cannot fail halfway.
 void WordGraph::set(std::string_view word, bool isHeld) {
     assert(!word.empty() && word.size() <= LongestWord && find(word).isWord() != isHeld);
-    if (!store_) store_ = std::make_shared<EdgeStore>();
-    store_->reserve(MostEditedEdges);
+    auto store = place_ ? place_->store : std::make_shared<EdgeStore>();
+    store->reserve(MostEditedEdges);
+    if (place_.use_count() != 1) {
+        place_.reset(new Place{store, root()});
+        store->hold(root());
+    }
     const std::uint32_t change = isHeld ? 1 : ~0U;
-    CountingBits([&] { Edit(*store_).toggle(root_, word, change); });
+    CountingBits([&] { Edit(*store).toggle(place_->root, word, change); });
     size_ += change;
 }
 

@@ -14,9 +14,6 @@ class WordGraph {
     WordGraph() = default;
     /// The base of a finished store.
     explicit WordGraph(std::shared_ptr<EdgeStore> store);
-    WordGraph(const WordGraph& other);
-    WordGraph& operator=(WordGraph other) noexcept;
-    ~WordGraph();
 
     /// The number of words.
     std::uint32_t size() const { return size_; }
@@ -29,19 +26,25 @@ class WordGraph {
     void set(std::string_view word, bool isHeld);
 
     /// Whether no smaller graph spells the same words: true until an edit.
-    bool isMinimal() const { return !store_ || root_ == store_->edges()[0]; }
+    bool isMinimal() const { return root() == edges()[0]; }
     /// Whether both are the same snapshot, with no edit between them.
     bool operator==(const WordGraph& other) const = default;
 
     /// For those who walk the edges themselves. Valid until the next edit.
-    const Edge* edges() const { return store_ ? store_->edges() : &root_; }
-    const Edge& root() const { return root_; }
+    const Edge* edges() const { return place_ ? place_->store->edges() : &Nowhere; }
+    const Edge& root() const { return place_ ? place_->root : Nowhere; }
     /// Above the index of every edge.
-    std::size_t edgesEnd() const { return store_ ? store_->size() : 1; }
+    std::size_t edgesEnd() const { return place_ ? place_->store->size() : 1; }
 
   private:
-    std::shared_ptr<EdgeStore> store_;
-    Edge root_;
+    /// Holds what the root leads to.
+    struct Place {
+        std::shared_ptr<EdgeStore> store;
+        Edge root;
+        ~Place() { store->release(root); }
+    };
+
+    std::shared_ptr<Place> place_;
     std::uint32_t size_ = 0;
 };
 

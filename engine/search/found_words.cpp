@@ -1,7 +1,7 @@
 #include "search/found_words.h"
 
 #include <algorithm>
-#include <utility>
+#include <numeric>
 
 namespace Quorle {
 
@@ -46,28 +46,17 @@ void FoundWords::take(const FoundWord* end, std::uint32_t letters) {
     size_ = static_cast<std::size_t>(to - words_.data());
 }
 
-/// Sorts by all digits, the lowest first; how often each occurs is counted in one pass.
+/// Sorts by all digits, the lowest first.
 template <unsigned DigitBits>
 void FoundWords::sortByDigits() {
     constexpr std::uint32_t Digits = 1U << DigitBits;
-    constexpr std::size_t Most = (32 + DigitBits - 1) / DigitBits;
-    const auto digit = [](const FoundWord& word, std::size_t i) {
-        return word.number >> i * DigitBits & (Digits - 1);
-    };
-    const auto bits = static_cast<unsigned>(std::bit_width(knownSize_ - 1));
-    const std::size_t used = (bits + DigitBits - 1) / DigitBits;
-    std::array<std::array<std::uint32_t, Digits>, Most> places;
-    std::fill_n(places.begin(), used, std::array<std::uint32_t, Digits>{});
-    for (std::size_t word = 0; word < size_; ++word) {
-        for (std::size_t i = 0; i < used; ++i) ++places[i][digit(words_[word], i)];
-    }
     sorted_.resize(words_.size());
-    for (std::size_t i = 0; i < used; ++i) {
-        std::uint32_t before = 0;
-        for (std::uint32_t& place : places[i]) before += std::exchange(place, before);
-        for (std::size_t word = 0; word < size_; ++word) {
-            sorted_[places[i][digit(words_[word], i)]++] = words_[word];
-        }
+    for (unsigned shift = 0; knownSize_ >> shift != 0; shift += DigitBits) {
+        const auto digit = [&](std::size_t i) { return words_[i].number >> shift & (Digits - 1); };
+        std::array<std::uint32_t, Digits> places{};
+        for (std::size_t i = 0; i < size_; ++i) ++places[digit(i)];
+        std::exclusive_scan(places.begin(), places.end(), places.begin(), 0U);
+        for (std::size_t i = 0; i < size_; ++i) sorted_[places[digit(i)]++] = words_[i];
         words_.swap(sorted_);
     }
 }

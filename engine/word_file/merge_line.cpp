@@ -4,16 +4,128 @@
 #include <chrono>
 #include <new>
 
+#include "word_file/word_text.h"
+
 namespace Quorle {
 
 namespace {
+
+constexpr std::size_t BlockSize = std::size_t{16} << 10;
+// Of a token that lies across blocks no more is kept: it is no word, however it goes on.
+constexpr std::size_t MostKept = LongestWord + 1;
+constexpr std::size_t WordsAtOnce = 256;
+constexpr double ReadingShare = 0.4;  // of the time; the rest is building
+
+// Someone who changes the dictionary at every step must not keep the merge from ending: the last
+// attempt is made at one go.
+constexpr int MostAttempts = 8;
 
 using Clock = std::chrono::steady_clock;
 
 // A piece of work more may follow when the time is up.
 constexpr std::chrono::microseconds StepTime{3500};
 
+bool HasByteOrderMark(const std::vector<std::byte>& text) {
+    return text[0] == std::byte{0xEF} && text[1] == std::byte{0xBB} && text[2] == std::byte{0xBF};
+}
+
 }  // namespace
+
+FileMerge::FileMerge(Dictionary& dictionary, const char* path)
+    : dictionary_(dictionary),
+      file_(OpenRegularFile(AT_FDCWD, path, size_)),
+      left_(size_),
+      text_(MostKept + BlockSize + LongestWord) {}
+
+bool FileMerge::work() {
+    if (!build_) return readOn();
+    if (isIn_) return build_->builder.giveBack();
+    const bool isUpToDate =
+        dictionary_.words() == build_->base && dictionary_.limits.longest == build_->longest;
+    if (!isUpToDate) return beginAnew();
+    isIn_ = !addWords();
+    if (isIn_) dictionary_.replace(build_->builder.finish());
+    return true;
+}
+
+double FileMerge::fraction() const {
+    const auto part = [](std::size_t done, std::size_t all) {
+        return all == 0 ? 1 : std::min(1.0, static_cast<double>(done) / static_cast<double>(all));
+    };
+    if (!build_) return ReadingShare * part(size_ - left_, size_);
+    const std::size_t words = build_->base.size() + words_.size();
+    return ReadingShare + (1 - ReadingShare) * part(build_->added, words);
+}
+
+/// False when the file cannot be read on.
+bool FileMerge::readOn() {
+    const std::size_t size = std::min(left_, BlockSize);
+    std::size_t got = 0;
+    if (!ReadOn(file_.number(), text_.data() + used_, size, got)) return false;
+    if (left_ == size_ && got >= 3 && HasByteOrderMark(text_)) {
+        std::fill_n(text_.begin(), 3, std::byte{' '});
+    }
+    used_ += got;
+    takeWords();
+    left_ -= got;
+    if (left_ > 0 && got == size) return true;
+    // A word that was written on beyond the end since the file was opened is taken whole.
+    if (used_ > 0) {
+        if (!ReadOn(file_.number(), text_.data() + used_, MostKept, got)) return false;
+        std::byte* const rest = text_.data() + used_;
+        std::byte* const space = std::find_if(rest, rest + got, IsSpace);
+        *space = std::byte{' '};
+        used_ = static_cast<std::size_t>(space + 1 - text_.data());
+        takeWords();
+    }
+    words_.finish();
+    build_ = std::make_unique<Build>(dictionary_, words_);
+    return true;
+}
+
+/// Takes in the words of the text, and keeps the token that it ends within.
+void FileMerge::takeWords() {
+    std::byte* const end = text_.data() + used_;
+    *end = std::byte{0};
+    const std::byte* const token =
+        ReadWords(text_.data(), end, [this](PackedWord word) { words_.add(word); });
+    used_ = std::min(static_cast<std::size_t>(end - token), MostKept);
+    std::copy_n(token, used_, text_.data());
+}
+
+FileMerge::Build::Build(const Dictionary& dictionary, SortedWords& words)
+    : base(dictionary.words()),
+      longest(dictionary.limits.longest),
+      cursor(base),
+      builder(base.edgesEnd() + words.size()),
+      held(cursor.next()),
+      fresh(words.next()) {}
+
+/// False when all words are in.
+bool FileMerge::addWords() {
+    Build& build = *build_;
+    const auto longest = static_cast<std::size_t>(build.longest);
+    for (std::size_t i = 0; i < WordsAtOnce; ++i, ++build.added) {
+        const PackedWord word = std::min(build.held, build.fresh);
+        if (word == NoWord) return false;
+        if (word == build.held || LengthOf(word) <= longest) build.builder.add(word);
+        if (word == build.fresh) build.fresh = words_.next();
+        if (word == build.held) build.held = build.cursor.next();
+    }
+    return true;
+}
+
+/// The dictionary has changed; and words taken out are given back already: the file is read again.
+bool FileMerge::beginAnew() {
+    build_.reset();
+    words_ = {};
+    lseek(file_.number(), 0, SEEK_SET);
+    left_ = size_;
+    used_ = 0;
+    bool goesOn = true;
+    for (const bool atOneGo = ++attempts_ >= MostAttempts; atOneGo && goesOn;) goesOn = work();
+    return goesOn;
+}
 
 /// Goes on to the next file that can be read, where none is being merged; false when there is none.
 bool MergeLine::hasCurrent() {

@@ -30,7 +30,6 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
         Board board{};
         std::copy(letters.begin(), letters.end(), board.begin());
         search_->search(graph_, board, limits, found_);
-        found_.finish(board);
         for (std::size_t i = 0; i < found_.size(); ++i) {
             char word[LongestWord];
             spelled.emplace_back(word, found_.spell(i, word));
