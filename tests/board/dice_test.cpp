@@ -12,7 +12,8 @@ TEST_F(ShakenCubes, DrawACubeAndThenItsFaceForEachPlace) {
     draws_.assign(32, 0x1.fffffep-1F);
     EXPECT_EQ(Dice::ShakeCubes(), "YLCNISBDUERRNBBP");
     EXPECT_EQ(drawn_, 32);
-    draws_ = {9.5F / 16, 1.5F / 6, 9.5F / 15};  // the tenth cube, and as that is taken the eleventh
+    // The tenth cube, just, and as that is taken the eleventh.
+    draws_ = {9.05F / 16, 1.05F / 6, 9.05F / 15};
     draws_.resize(32);
     EXPECT_EQ(Dice::ShakeCubes(), "QIETISSOYWOVAATI");
 }

@@ -65,13 +65,10 @@ TEST_F(Files, OfSettingsKeepEveryValueAndForeignLine) {
     const std::pair<std::string, std::string> names[] = {
         {"a", "b=c"}, {"a=b", "c"}, {"a\\", "b"}, {"a", "\\b"},       {"[a]", "#b"},
         {"a ", "b"},  {"a", "b"},   {"A", "b"},   {longest, longest}, {"ä", "ü"}};
-    for (const auto& [key, name] : names) {
-        EXPECT_EQ(Setting(key, name), "absent");
-        EXPECT_TRUE(set(key, name, (name + key).substr(0, 255)));
-    }
-    for (const auto& [key, name] : names) {
-        EXPECT_EQ(Setting(key, name), (name + key).substr(0, 255));
-    }
+    const auto value = [](auto& key, auto& name) { return (name + key).substr(0, 255); };
+    for (const auto& [key, name] : names) EXPECT_TRUE(set(key, name, value(key, name)));
+    for (const auto& [key, name] : names) EXPECT_EQ(Setting(key, name), value(key, name));
+    EXPECT_EQ(Setting("b", "a"), "absent");
     for (const std::string& bad : {longest + "x", std::string("a\tb"), std::string("\n")}) {
         EXPECT_FALSE(set(bad, "name", "value") || set("key", bad, "value") || set("k", "n", bad));
     }

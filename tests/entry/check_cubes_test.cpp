@@ -42,9 +42,8 @@ TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
         ASSERT_EQ(IsOnBoard(word) == True, !chains.empty());
         ASSERT_EQ(Marked(), expected);
     }
-    for (const char* word : {"Air", "a r", "a1r", "air ", "x\xC3\xA9"}) {
-        EXPECT_FALSE(IsOnBoard(word)) << word;
-    }
+    for (const char* word : {"Air", "a r", "a1r", "air ", "\xC3\xA9"})
+        EXPECT_FALSE(IsOnBoard(word));
     EXPECT_TRUE(IsOnBoard(""));
     EXPECT_EQ(Marked(), Chain{});
 }
