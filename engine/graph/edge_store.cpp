@@ -1,16 +1,10 @@
 #include "graph/edge_store.h"
 
 #include <algorithm>
-#include <cstdlib>
-#include <new>
 
 namespace Quorle {
 
-namespace {
-
 constexpr std::size_t MostEdges = 0x7fffffffU;
-
-}  // namespace
 
 std::uint32_t CountWords(const Edge* edges, const Edge& edge) {
     std::uint32_t count = 0;
@@ -22,24 +16,12 @@ std::uint32_t CountWords(const Edge* edges, const Edge& edge) {
     return count;
 }
 
-EdgeStore::EdgeStore() {
-    append(1);
-    edges_[0] = {};
-}
-
-EdgeStore::~EdgeStore() {
-    std::free(edges_);
-}
-
 void EdgeStore::reserve(std::size_t count) {
     const std::size_t needed = size_ + count;
     if (needed <= capacity_) return;
     if (needed > MostEdges) throw std::bad_alloc();
-    // The C library moves large arrays by their pages.
     const std::size_t capacity = std::max(needed, capacity_ + capacity_ / 8);
-    void* grown = std::realloc(static_cast<void*>(edges_), capacity * sizeof(Edge));
-    if (grown == nullptr) throw std::bad_alloc();
-    edges_ = static_cast<Edge*>(grown);
+    Resize(edges_, capacity);
     capacity_ = capacity;
 }
 
@@ -52,10 +34,7 @@ std::uint32_t EdgeStore::append(std::size_t count) {
 void EdgeStore::closeBase(const Edge& root) {
     edges_[0] = root;
     baseEnd_ = static_cast<std::uint32_t>(size_);
-    void* shrunk = std::realloc(static_cast<void*>(edges_), size_ * sizeof(Edge));
-    if (shrunk == nullptr) return;
-    edges_ = static_cast<Edge*>(shrunk);
-    capacity_ = size_;
+    Resize(edges_, capacity_ = size_);
 }
 
 std::uint32_t EdgeStore::allocate(std::uint32_t count) {

@@ -12,6 +12,8 @@
 #include <cstddef>
 #include <cstdint>
 
+#include "graph/memory.h"
+
 namespace Quorle {
 
 inline constexpr int Letters = 26;
@@ -64,12 +66,12 @@ std::uint32_t CountWords(const Edge* edges, const Edge& edge);
 /// Owns the array. Grows at its end; edited nodes that nothing leads to are used again.
 class EdgeStore {
   public:
-    EdgeStore();
-    ~EdgeStore();
-    EdgeStore(const EdgeStore&) = delete;
-    EdgeStore& operator=(const EdgeStore&) = delete;
+    EdgeStore() {
+        append(1);
+        edges_[0] = {};
+    }
 
-    Edge* edges() { return edges_; }
+    Edge* edges() { return edges_.get(); }
     std::size_t size() const { return size_; }
 
     /// Makes room for `count` more edges. Throws std::bad_alloc; the content stays.
@@ -92,7 +94,7 @@ class EdgeStore {
     void release(const Edge& edge);
 
   private:
-    Edge* edges_ = nullptr;
+    Memory<Edge> edges_;
     std::size_t size_ = 0;
     std::size_t capacity_ = 0;
     std::uint32_t baseEnd_ = 1;

@@ -7,7 +7,7 @@ namespace Quorle {
 
 namespace {
 
-constexpr std::size_t LeastEdges = 1024;
+constexpr std::size_t LeastSlots = 512;
 constexpr std::size_t SlotsAtOnce = 1 << 18;
 
 std::uint64_t Hash(const OpenNode& open) {
@@ -45,9 +45,8 @@ void GraphBuilder::Table::insert(Slot slot, std::uint64_t hash) {
 }
 
 GraphBuilder::GraphBuilder(std::size_t expectedEdges) : edges_(std::make_shared<EdgeStore>()) {
-    const std::size_t expected = std::max(LeastEdges, expectedEdges);
-    edges_->reserve(expected);
-    tables_.emplace_back(std::bit_ceil(expected / 2));
+    edges_->reserve(expectedEdges);
+    tables_.emplace_back(std::bit_ceil(LeastSlots + expectedEdges / 2));
 }
 
 void GraphBuilder::add(PackedWord word) {
@@ -75,12 +74,8 @@ WordGraph GraphBuilder::finish(const Edge& root) {
 bool GraphBuilder::giveBack() {
     if (tables_.empty()) return false;
     Table& table = tables_.back();
-    if (table.last < SlotsAtOnce) {
-        tables_.pop_back();
-    } else {
-        table.last -= SlotsAtOnce;
-        Shrink(table.slots, table.last + 1);
-    }
+    if (table.last >= SlotsAtOnce) Resize(table.slots, (table.last -= SlotsAtOnce) + 1);
+    if (table.last < SlotsAtOnce) tables_.pop_back();
     return true;
 }
 

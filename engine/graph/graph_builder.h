@@ -4,9 +4,9 @@
 #include <memory>
 #include <vector>
 
+#include "graph/memory.h"
 #include "graph/packed_word.h"
 #include "graph/word_graph.h"
-#include "graph/zeroed_memory.h"
 
 namespace Quorle {
 
@@ -47,13 +47,11 @@ class GraphBuilder {
     /// Makes room ahead for about so many edges, which saves moving what is built as it grows.
     explicit GraphBuilder(std::size_t expectedEdges);
 
-    /// `word`: after every word before it. Throws std::bad_alloc; then the builder is of no more
-    /// use.
+    /// `word`: after every word before it. When std::bad_alloc is thrown the builder is of no use.
     void add(PackedWord word);
     /// The graph of all words added. The builder is of no more use.
     WordGraph finish();
-    /// Then gives back some of the builder's memory, for at once it would take long; false when
-    /// there is no more.
+    /// Then: gives some memory back, for all at once takes long; false when there is no more.
     bool giveBack();
 
     /// Instead of words, nodes can be stored one by one, children first. Gives what an edge says
@@ -72,7 +70,7 @@ class GraphBuilder {
         explicit Table(std::size_t slots);
         std::uint32_t find(const OpenNode& open, std::uint64_t hash, const Edge* edges) const;
         void insert(Slot slot, std::uint64_t hash);
-        ZeroedMemory<Slot> slots;
+        Memory<Slot> slots;
         std::size_t last;
         std::size_t room;
     };

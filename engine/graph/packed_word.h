@@ -15,8 +15,7 @@ inline constexpr std::size_t LongestWord = 16;
 /// last. Numbers and words have the same order.
 __extension__ using PackedWord = unsigned __int128;
 
-/// After every word.
-inline constexpr PackedWord NoWord = ~PackedWord{0};
+inline constexpr PackedWord NoWord = ~PackedWord{0};  ///< after every word
 
 /// A letter (0 "a" .. 25 "z") as that of a word's place, 0..15.
 inline PackedWord PackedLetter(int letter, std::size_t place) {

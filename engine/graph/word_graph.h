@@ -15,8 +15,7 @@ class WordGraph {
     /// The base of a finished store.
     explicit WordGraph(std::shared_ptr<EdgeStore> store);
 
-    /// The number of words.
-    std::uint32_t size() const { return size_; }
+    std::uint32_t size() const { return size_; }  ///< words
     /// Where these letters lead: an edge that counts the words before those that go on from it.
     /// Without letters and no word when no word begins so.
     Edge find(std::string_view letters) const;

@@ -101,10 +101,7 @@ std::string WordsAsText(const WordGraph& words) {
 void SearchBoard(std::string_view letters) {
     Board board;
     std::copy(letters.begin(), letters.end(), board.begin());
-    if (!State.search) {
-        const bool isWide = CanMatch(Matching::Avx2);
-        State.search = std::make_unique<BoardSearch>(isWide ? Matching::Avx2 : Matching::Plain);
-    }
+    if (!State.search) State.search = std::make_unique<BoardSearch>();
     const Dictionary& dictionary = State.dictionary;
     State.search->search(dictionary.words(), board, dictionary.limits, State.found);
 }

@@ -50,7 +50,8 @@ class RecentChains {
 /// The working memory of searches, some 3 MB of which each touches what it needs.
 class BoardSearch {
   public:
-    explicit BoardSearch(Matching matching);
+    explicit BoardSearch(Matching matching = CanMatch(Matching::Avx2) ? Matching::Avx2
+                                                                      : Matching::Plain);
 
     /// Replaces `found` by the words found. Throws std::bad_alloc.
     void search(const WordGraph& graph, const Board& board, WordLimits limits, FoundWords& found);

@@ -5,15 +5,11 @@
 
 namespace Quorle {
 
-namespace {
-
 // A quarter of a million numbers have three digits of few values each, or two of many, which take
 // longer to add up.
 constexpr unsigned FewBits = 6;
 constexpr unsigned ManyBits = 9;
 constexpr std::size_t ManyWords = 300;
-
-}  // namespace
 
 void FoundWords::clear() {
     for (std::size_t i = 0; i < size_; ++i) known_[words_[i].number / 64] = 0;

@@ -3,8 +3,8 @@
 // for: their order, and their letters.
 #include <vector>
 
+#include "graph/memory.h"
 #include "graph/packed_word.h"
-#include "graph/zeroed_memory.h"
 #include "search/board.h"
 
 namespace Quorle {
@@ -44,7 +44,7 @@ class FoundWords {
     std::vector<FoundWord> words_;  // more than size_
     std::vector<FoundWord> sorted_;
     std::size_t size_ = 0;
-    ZeroedMemory<std::uint64_t> known_;  // a bit for each word of the dictionary
+    Memory<std::uint64_t> known_;  // a bit for each word of the dictionary
     std::size_t knownSize_ = 0;
     Board board_{};
     bool isFinished_ = false;

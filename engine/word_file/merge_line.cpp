@@ -38,6 +38,7 @@ FileMerge::FileMerge(Dictionary& dictionary, const char* path)
       text_(MostKept + BlockSize + LongestWord) {}
 
 bool FileMerge::work() {
+    if (!file_) return false;
     if (!build_) return readOn();
     if (isIn_) return build_->builder.giveBack();
     const bool isUpToDate =
@@ -127,32 +128,25 @@ bool FileMerge::beginAnew() {
     return goesOn;
 }
 
-/// Goes on to the next file that can be read, where none is being merged; false when there is none.
-bool MergeLine::hasCurrent() {
-    while (!current_ && !waiting_.empty()) {
-        current_.emplace(dictionary_, waiting_.front().c_str());
-        waiting_.pop();
-        if (*current_) break;
-        current_.reset();
-        ++done_;
-    }
-    return current_.has_value();
-}
-
 /// Works until the time is up; false when the line is through.
 bool MergeLine::work() {
-    for (const auto end = Clock::now() + StepTime; hasCurrent() && Clock::now() < end;) {
+    const auto end = Clock::now() + StepTime;
+    do {
+        if (!current_ && waiting_.empty()) return false;
+        if (!current_) {
+            current_.emplace(dictionary_, waiting_.front().c_str());
+            waiting_.pop();
+        }
         bool goesOn = false;
         try {
             goesOn = current_->work();
         } catch (const std::bad_alloc&) {
             // The file's words do not fit in memory; the dictionary is as it was.
         }
-        if (goesOn) continue;
-        current_.reset();
-        ++done_;
-    }
-    return hasCurrent();
+        if (!goesOn) current_.reset();
+        done_ += goesOn ? 0 : 1;
+    } while (Clock::now() < end);
+    return current_ || !waiting_.empty();
 }
 
 std::int32_t MergeLine::step(const char* path) {
@@ -162,7 +156,7 @@ std::int32_t MergeLine::step(const char* path) {
         return 100;
     }
     const double files = done_ + 1 + static_cast<double>(waiting_.size());
-    const double done = (done_ + current_->fraction()) / files;
+    const double done = (done_ + (current_ ? current_->fraction() : 0)) / files;
     percent_ = std::clamp(static_cast<std::int32_t>(100 * done), percent_, 99);
     return percent_;
 }

@@ -21,11 +21,10 @@ class FileMerge {
   public:
     /// The file is read as long as it is now: one that grows has an end, too.
     FileMerge(Dictionary& dictionary, const char* path);
-    /// False when there is no regular file that can be read, and nothing to do.
-    explicit operator bool() const { return static_cast<bool>(file_); }
 
-    /// Does a piece of the work, well under a millisecond; false when there is no more. What is
-    /// added and removed meanwhile is kept. Throws std::bad_alloc; the dictionary is as it was.
+    /// Does a piece of the work, well under a millisecond; false when there is no more, as when
+    /// there is no regular file that can be read. What is added and removed meanwhile is kept.
+    /// Throws std::bad_alloc; the dictionary is as it was.
     bool work();
     /// The part that is done, 0..1.
     double fraction() const;
@@ -73,7 +72,6 @@ class MergeLine {
 
   private:
     bool work();
-    bool hasCurrent();
 
     Dictionary& dictionary_;
     std::optional<FileMerge> current_;
