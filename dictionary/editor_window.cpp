@@ -52,7 +52,7 @@ DictionaryEditor::DictionaryEditor()
       client_(new QWidget(this)) {
     setObjectName("DictionaryEditor");
     setWindowTitle("Dictionary Editor");
-    client_->setFixedSize(Twips(ClientWidth), Twips(ClientHeight));
+    client_->setMinimumSize(Twips(ClientWidth), Twips(ClientHeight));
     makeMenu();
     makeLists();
     makeWordEntry();
