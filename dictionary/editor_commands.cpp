@@ -53,7 +53,7 @@ void OpenEditor() {
     ListStartingLetters(True);
     SetDefaultButton(&editor, editor.Add);
     ListWords();
-    editor.waitsForGameEnd = false;
+    editor.waits = false;
     WindowFront::Bring(editor);
     editor.NewWord->setFocus();
 }

@@ -1,5 +1,6 @@
 #include "dictionary/editor_window.h"
 
+#include <QApplication>
 #include <QCloseEvent>
 #include <QComboBox>
 #include <QLabel>
@@ -8,6 +9,7 @@
 #include <QListView>
 #include <QPushButton>
 #include <QStringListModel>
+#include <QWindow>
 
 #include "dictionary/editor_commands.h"
 #include "dictionary/listing.h"
@@ -56,6 +58,10 @@ DictionaryEditor::DictionaryEditor()
     makeMenu();
     makeLists();
     makeWordEntry();
+    // Later, when it is known which of our windows is in front.
+    connect(
+        qApp, &QGuiApplication::focusWindowChanged, this, [] { Dictionary::ShowWaitingEditor(); },
+        Qt::QueuedConnection);
 }
 
 void DictionaryEditor::makeMenu() {

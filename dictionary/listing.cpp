@@ -88,11 +88,12 @@ void ShowEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     if (editor.isVisible()) return;
     const bool playing = State.TimeRemaining != 0;
-    editor.waitsForGameEnd = playing && Platform::OnWayland();
-    if (editor.waitsForGameEnd) return;
+    const bool elsewhere = !WindowFront::IsOurs();
+    editor.waits = (playing || elsewhere) && Platform::OnWayland();
+    if (editor.waits) return;
     editor.NewWord->setFocus();
     const bool boxIsUp = QApplication::activeModalWidget() != nullptr;
-    if (playing || boxIsUp || !WindowFront::IsOurs()) {
+    if (playing || boxIsUp || elsewhere) {
         WindowFront::ShowBehind(editor);
     } else {
         WindowFront::Bring(editor);
@@ -101,7 +102,7 @@ void ShowEditor() {
 
 void ShowWaitingEditor() {
     if (Windows::Existing<DictionaryEditor> == nullptr) return;
-    if (Windows::Existing<DictionaryEditor>->waitsForGameEnd) ShowEditor();
+    if (Windows::Existing<DictionaryEditor>->waits) ShowEditor();
 }
 
 }  // namespace Dictionary
