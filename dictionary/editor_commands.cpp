@@ -53,7 +53,7 @@ void OpenEditor() {
     ListStartingLetters(True);
     Platform::SetDefaultButton(&editor, editor.Add);
     ListWords();
-    editor.waitsForGameEnd = false;
+    editor.waits = false;
     Platform::BringToFront(editor);
     editor.NewWord->setFocus();
 }

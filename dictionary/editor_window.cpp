@@ -1,5 +1,6 @@
 #include "dictionary/editor_window.h"
 
+#include <QApplication>
 #include <QCloseEvent>
 #include <QComboBox>
 #include <QLabel>
@@ -8,6 +9,7 @@
 #include <QListView>
 #include <QPushButton>
 #include <QStringListModel>
+#include <QWindow>
 
 #include "dictionary/editor_commands.h"
 #include "dictionary/listing.h"
@@ -54,10 +56,14 @@ DictionaryEditor::DictionaryEditor()
       client_(new QWidget(this)) {
     setObjectName("DictionaryEditor");
     setWindowTitle("Dictionary Editor");
-    client_->setFixedSize(Twips(ClientWidth), Twips(ClientHeight));
+    client_->setMinimumSize(Twips(ClientWidth), Twips(ClientHeight));
     makeMenu();
     makeLists();
     makeWordEntry();
+    // Later, when it is known which of our windows is in front.
+    connect(
+        qApp, &QGuiApplication::focusWindowChanged, this, [] { Dictionary::ShowWaitingEditor(); },
+        Qt::QueuedConnection);
 }
 
 void DictionaryEditor::makeMenu() {

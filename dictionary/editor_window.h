@@ -30,7 +30,7 @@ class DictionaryEditor : public QWidget {
     QAction* Merge = nullptr;
     QAction* SaveAs = nullptr;
     QAction* Exit = nullptr;
-    bool waitsForGameEnd = false;  ///< to be shown: it would take the game's keys
+    bool waits = false;  ///< to be shown: it would take another's keys
 
   protected:
     void closeEvent(QCloseEvent* event) override;

@@ -88,11 +88,12 @@ void ShowEditor() {
     DictionaryEditor& editor = Windows::Shared<DictionaryEditor>();
     if (editor.isVisible()) return;
     const bool playing = State.TimeRemaining != 0;
-    editor.waitsForGameEnd = playing && Platform::OnWayland();
-    if (editor.waitsForGameEnd) return;
+    const bool elsewhere = !Platform::FrontIsOurs();
+    editor.waits = (playing || elsewhere) && Platform::OnWayland();
+    if (editor.waits) return;
     editor.NewWord->setFocus();
     const bool boxIsUp = QApplication::activeModalWidget() != nullptr;
-    if (playing || boxIsUp || !Platform::FrontIsOurs()) {
+    if (playing || boxIsUp || elsewhere) {
         Platform::ShowBehind(editor);
     } else {
         Platform::BringToFront(editor);
@@ -101,7 +102,7 @@ void ShowEditor() {
 
 void ShowWaitingEditor() {
     if (Windows::Existing<DictionaryEditor> == nullptr) return;
-    if (Windows::Existing<DictionaryEditor>->waitsForGameEnd) ShowEditor();
+    if (Windows::Existing<DictionaryEditor>->waits) ShowEditor();
 }
 
 }  // namespace Dictionary

@@ -16,10 +16,11 @@ void ListWords();
 
 /// Shows the editor where it is hidden. During a game, a message box or behind
 /// another program it takes no focus: what the player types belongs there. Where
-/// it cannot but take it, it waits for the game's end.
+/// it cannot but take it, it waits for the game's end and for the program's return to
+/// the front.
 void ShowEditor();
 
-/// Shows the editor where it waits for the game's end.
+/// Shows the editor where it waits and need not wait any longer.
 void ShowWaitingEditor();
 
 }  // namespace Dictionary

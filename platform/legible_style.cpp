@@ -11,6 +11,8 @@ namespace {
 
 constexpr double Legible = 4.5;
 constexpr int Steps = 20;
+constexpr int SparedHeight = 8;  // more than this no style can do without
+constexpr QMargins TextMargins(4, 2, 0, 2);
 constexpr std::array Pairs{std::pair{QPalette::WindowText, QPalette::Window},
                            std::pair{QPalette::Text, QPalette::Base},
                            std::pair{QPalette::ButtonText, QPalette::Button},
@@ -82,8 +84,47 @@ void LegibleStyle::drawControl(ControlElement element, const QStyleOption* optio
         return QProxyStyle::drawControl(element, &marked, painter, widget);
     }
     QProxyStyle::drawControl(element, option, painter, widget);
-    if (element == CE_ShapedFrame && option->state.testFlag(State_HasFocus)) {
+    const auto* frame = qstyleoption_cast<const QStyleOptionFrame*>(option);
+    if (element == CE_ShapedFrame && frame != nullptr && frame->frameShape != QFrame::NoFrame &&
+        frame->state.testFlag(State_HasFocus)) {
         painter->setPen(option->palette.color(QPalette::Highlight));
         painter->drawRect(option->rect.adjusted(0, 0, -1, -1));
     }
+}
+
+// Some styles leave out the frame and the arrow of a low box that can be typed in,
+// but not those of another.
+void LegibleStyle::drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
+                                      QPainter* painter, const QWidget* widget) const {
+    const auto* box = qstyleoption_cast<const QStyleOptionComboBox*>(option);
+    if (box == nullptr || widget == nullptr ||
+        widget->sizeHint().height() - widget->height() <= SparedHeight) {
+        return QProxyStyle::drawComplexControl(control, option, painter, widget);
+    }
+    QStyleOptionComboBox low(*box);
+    low.editable = false;
+    QProxyStyle::drawComplexControl(control, &low, painter, widget);
+}
+
+// A mark of a fixed size is scaled to its box, which would cut it off.
+void LegibleStyle::drawPrimitive(PrimitiveElement element, const QStyleOption* option,
+                                 QPainter* painter, const QWidget* widget) const {
+    const bool cut = element == PE_IndicatorCheckBox && widget != nullptr &&
+                     option->rect.right() > widget->rect().right();
+    if (!cut) return QProxyStyle::drawPrimitive(element, option, painter, widget);
+    const double share = static_cast<double>(widget->width()) / (option->rect.right() + 1);
+    painter->save();
+    painter->translate(0, option->rect.center().y() * (1 - share));
+    painter->scale(share, share);
+    QProxyStyle::drawPrimitive(element, option, painter, widget);
+    painter->restore();
+}
+
+// Some draw the text of a low box upon its frame.
+QRect LegibleStyle::subControlRect(ComplexControl control, const QStyleOptionComplex* option,
+                                   SubControl part, const QWidget* widget) const {
+    const QRect place = QProxyStyle::subControlRect(control, option, part, widget);
+    const bool upon = control == CC_ComboBox && part == SC_ComboBoxEditField &&
+                      place.left() == option->rect.left();
+    return upon ? place.marginsRemoved(TextMargins) : place;
 }

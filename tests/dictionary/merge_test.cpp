@@ -126,6 +126,20 @@ TEST_F(Merging, OnWaylandNothingThatWouldTakeTheFocusIsShownInAGame) {
     EXPECT_TRUE(comesToFront("Results"));
 }
 
+TEST_F(Merging, OnWaylandItsEndTakesNoKeysFromAnotherProgram) {
+    Platform::OnWayland = [] { return true; };
+    mergeMany('a');
+    QWindow elsewhere;
+    elsewhere.show();
+    elsewhere.requestActivate();
+    ASSERT_TRUE(QTest::qWaitFor([] { return QApplication::activeWindow() == nullptr; }));
+    EXPECT_TRUE(QTest::qWaitFor([this] { return !isShown("Progress"); }, 60'000));
+    EXPECT_FALSE(isShown("DictionaryEditor"));
+    bringToFront("Main");
+    EXPECT_TRUE(QTest::qWaitFor([this] { return isShown("DictionaryEditor"); }));
+    EXPECT_TRUE(comesToFront("DictionaryEditor"));
+}
+
 TEST_F(Merging, ASecondFileWaitsInLine) {
     mergeMany('m');
     press("Dictionary");

@@ -1,6 +1,8 @@
 // Colours: the desktop's, kept legible, and our own, which stay when those change.
 #include <QAbstractButton>
 #include <QApplication>
+#include <QLineEdit>
+#include <QStyleOption>
 
 #include "platform/legible_style.h"
 #include "support/program_fixture.h"
@@ -8,6 +10,25 @@
 namespace {
 
 using Palettes = PlayedBoard;
+
+// As some are: a large mark; a box too low for a frame has none, nor an arrow or margins.
+struct RoomyStyle : QProxyStyle {
+    RoomyStyle() : QProxyStyle("Fusion") {}
+    QSize sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& size,
+                           const QWidget* widget) const override {
+        return QProxyStyle::sizeFromContents(type, option, size + QSize(0, 20), widget);
+    }
+    int pixelMetric(PixelMetric, const QStyleOption*, const QWidget*) const override { return 30; }
+    QRect subControlRect(ComplexControl, const QStyleOptionComplex* option, SubControl,
+                         const QWidget*) const override {
+        return option->rect.adjusted(0, 0, -30, 0);
+    }
+    void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
+                            QPainter* painter, const QWidget* widget) const override {
+        if (qstyleoption_cast<const QStyleOptionComboBox*>(option)->editable) return;
+        QProxyStyle::drawComplexControl(control, option, painter, widget);
+    }
+};
 
 QColor Polished(QPalette::ColorRole wanted, const QPalette& given) {
     QPalette palette = given;
@@ -33,6 +54,20 @@ TEST_F(Palettes, TextsAreMovedFromTheirBackgroundNoFurtherThanNeeded) {
     palette.setColor(QPalette::WindowText, Qt::white);
     EXPECT_EQ(Polished(QPalette::Highlight, palette), QColor(140, 140, 140));
     EXPECT_LE(Polished(QPalette::HighlightedText, palette).red(), 26);
+}
+
+TEST_F(Palettes, WhatTheDesktopWouldHaveLargerIsDrawnWhole) {
+    press("Options");
+    LegibleStyle style(new RoomyStyle);
+    for (const char* name : {"TimeCombo", "SoundsOption"}) {
+        QWidget* small = control(name);
+        small->setStyle(&style);
+        small->setProperty("checked", false);
+        const QImage picture = small->grab().toImage();
+        const QColor edge = picture.pixelColor(small->width() - 1, small->height() / 2);
+        EXPECT_LT(edge.lightness(), small->palette().color(QPalette::Window).lightness()) << name;
+    }
+    EXPECT_GT(control("TimeCombo")->findChild<QLineEdit*>()->x(), 0);
 }
 
 TEST_F(Palettes, ADesktopThatTurnsDarkChangesTilesAndPicturesButNoColourOfOurs) {

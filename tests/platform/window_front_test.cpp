@@ -51,6 +51,8 @@ TEST_F(Fronts, OnWaylandNoWindowResistsBeingMaximised) {
     useWayland();
     press("Options");
     press("Dictionary");
+    const QWidget* letters = control("StartingLetters");
+    const QPoint corner = letters->mapTo(letters->window(), QPoint());
     const QSize large(2000, 1500);
     for (const char* name : {"OptionsDialog", "DictionaryEditor"}) {
         QWidget* window = control(name);
@@ -60,6 +62,7 @@ TEST_F(Fronts, OnWaylandNoWindowResistsBeingMaximised) {
         QTest::qWait(0);
         EXPECT_EQ(window->size(), large) << name;
     }
+    EXPECT_EQ(letters->mapTo(letters->window(), QPoint()), corner);
     boxes_.expectModal([](QWidget& box) {
         QTest::qWait(1);
         const QSize least = box.size();
