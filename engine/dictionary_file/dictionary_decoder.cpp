@@ -212,9 +212,9 @@ bool DecodeDictionary(std::span<const std::byte> file, DictionaryContent& conten
     DictionaryHeader header;
     if (file.size() < HeaderSize) return false;
     std::memcpy(&header, file.data(), HeaderSize);
-    auto store = IsSound(header, file) ? Decoder(header, file).read() : nullptr;
+    const auto store = IsSound(header, file) ? Decoder(header, file).read() : nullptr;
     if (!store) return false;
-    content = {WordGraph(std::move(store)), header.maxWordSize};
+    content = {WordGraph(store), header.maxWordSize};
     return true;
 }
 

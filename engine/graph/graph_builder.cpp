@@ -68,7 +68,7 @@ WordGraph GraphBuilder::finish() {
 
 WordGraph GraphBuilder::finish(const Edge& root) {
     edges_->closeBase({root.letters, root.first});
-    return WordGraph(std::move(edges_));
+    return WordGraph(edges_);
 }
 
 bool GraphBuilder::giveBack() {

@@ -106,7 +106,7 @@ class Edit {
 
 }  // namespace
 
-WordGraph::WordGraph(std::shared_ptr<EdgeStore> store)
+WordGraph::WordGraph(const std::shared_ptr<EdgeStore>& store)
     : place_(new Place{store, store->edges()[0]}), size_(CountWords(store->edges(), root())) {}
 
 Edge WordGraph::find(std::string_view letters) const {

@@ -13,7 +13,7 @@ class WordGraph {
   public:
     WordGraph() = default;
     /// The base of a finished store.
-    explicit WordGraph(std::shared_ptr<EdgeStore> store);
+    explicit WordGraph(const std::shared_ptr<EdgeStore>& store);
 
     std::uint32_t size() const { return size_; }  ///< words
     /// Where these letters lead: an edge that counts the words before those that go on from it.
