@@ -4,12 +4,15 @@
 #include <QScreen>
 #include <QTimer>
 #include <chrono>
+#include <clocale>
+#include <future>
 
 #include "app/main_window_events.h"
 #include "app/shutdown.h"
 #include "main_window/main_window.h"
 #include "main_window/tile_picture.h"
 #include "platform/heap.h"
+#include "platform/layout.h"
 #include "platform/legible_style.h"
 #include "platform/platform.h"
 #include "platform/session_end.h"
@@ -45,7 +48,10 @@ int main(int argc, char** argv) {
     Platform::UseDesktop();
     // Every window made anew has its pictures cached once more; ten times this is Qt's own bound.
     QPixmapCache::setCacheLimit(PictureCache);
+    std::setlocale(LC_ALL, "");  // the toolkit would while numbers are read
+    std::future<void> fonts = std::async(Platform::ReadFontList);
     QApplication application(argc, argv);
+    fonts.wait();
     // Before, there would be no desktop yet whose style could be asked for.
     QApplication::setStyle(new LegibleStyle(QApplication::style()));
     // The texts are English and have their places; mirrored, "=>" would point back.
