@@ -31,13 +31,16 @@ constexpr std::chrono::milliseconds AfterFirstPaint{100};
 
 constexpr int PictureCache = 1024;  // KiB
 
+void DrawTile(const Main& window, bool selected) {
+    MainWindow::TilePicture(selected, QString(), window.devicePixelRatioF(),
+                            window.palette().color(QPalette::Window));
+}
+
 void FinishWindow() {
     QIcon icon;
     for (const char* size : {"48", "128"}) icon.addFile(QString(":/quorle-%1.png").arg(size));
     QApplication::setWindowIcon(icon);
-    const Main& window = Windows::Shared<Main>();
-    MainWindow::TilePicture(true, QString(), window.devicePixelRatioF(),
-                            window.palette().color(QPalette::Window));
+    DrawTile(Windows::Shared<Main>(), true);
     Platform::TrimHeap();
 }
 
@@ -64,6 +67,7 @@ int main(int argc, char** argv) {
     CentreOnScreen(window);
     Platform::FollowSessionEnd([&window] { window.close(); });
     window.show();
+    DrawTile(window, false);  // while the window manager is at work
     QTimer::singleShot(AfterFirstPaint, &window, FinishWindow);
     const int result = QApplication::exec();
     App::DestroyWindows();
