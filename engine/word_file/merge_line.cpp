@@ -40,13 +40,12 @@ FileMerge::FileMerge(Dictionary& dictionary, const char* path)
 bool FileMerge::work() {
     if (!file_) return false;
     if (!build_) return readOn();
-    if (isIn_) return build_->builder.giveBack();
     const bool isUpToDate =
         dictionary_.words() == build_->base && dictionary_.limits.longest == build_->longest;
     if (!isUpToDate) return beginAnew();
-    isIn_ = !addWords();
-    if (isIn_) dictionary_.replace(build_->builder.finish());
-    return true;
+    if (addWords() || build_->builder.giveBack()) return true;
+    dictionary_.replace(*build_->merged);
+    return false;
 }
 
 double FileMerge::fraction() const {
@@ -108,7 +107,10 @@ bool FileMerge::addWords() {
     const auto longest = static_cast<std::size_t>(build.longest);
     for (std::size_t i = 0; i < WordsAtOnce; ++i, ++build.added) {
         const PackedWord word = std::min(build.held, build.fresh);
-        if (word == NoWord) return false;
+        if (word == NoWord) {
+            if (!build.merged) build.merged = build.builder.finish();
+            return false;
+        }
         if (word == build.held || LengthOf(word) <= longest) build.builder.add(word);
         if (word == build.fresh) build.fresh = words_.next();
         if (word == build.held) build.held = build.cursor.next();
