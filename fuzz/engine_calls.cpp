@@ -12,6 +12,7 @@ const std::uint8_t* At;
 const std::uint8_t* End;
 WordSet Held;
 std::int32_t Min, Max;
+bool IsForeign;  // a file that is not ours may hold a node twice, and is saved as it is
 
 int Number() {
     return At == End ? 0 : *At++;
@@ -78,6 +79,7 @@ void LoadAnything() {
     // Few bytes can spell very many words; such a dictionary is not read through.
     if (cNumberOfWords() > 20'000) cDictionaryClear();
     Held = AllWords();
+    IsForeign = true;
     Max = cMaxWordSize();
     REQUIRE(Max >= 2 && Max <= 16);
 }
@@ -161,7 +163,7 @@ void Check() {
     const std::string edited = Saved(), words = Folder / "words";
     REQUIRE(cWriteTextFile(words.c_str()) == 1 && cDictionaryClear() == 1);
     Finish(Step(0, words.c_str()));
-    REQUIRE(Saved() == edited);
+    REQUIRE(Saved() == edited || IsForeign);
 }
 
 }  // namespace
@@ -174,6 +176,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     cSetMinWordSize(Min = 3);
     cSetMaxWordSize(Max = 16);
     Held.clear();
+    IsForeign = false;
     using Call = void (*)();
     constexpr Call Add3 = [] { Add(Word()), Add(Word()), Add(Word()); };
     constexpr Call Calls[] = {Add3,         LookUp,        ChangeLimits,

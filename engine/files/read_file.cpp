@@ -33,11 +33,10 @@ bool ReadOn(int file, std::byte* to, std::size_t size, std::size_t& got) {
 
 ReadResult ReadFileAt(int folder, const char* path, std::vector<std::byte>& out) {
     out.clear();
-    std::size_t size = 0;
+    std::size_t size = 0, got = 0;
     const FileDescriptor file = OpenRegularFile(folder, path, size);
     if (!file) return errno == ENOENT ? ReadResult::Missing : ReadResult::Failed;
     if (size > MaxFileSize) return ReadResult::Failed;
-    std::size_t got = 0;
     out.resize(size + 1);  // a file that has grown meanwhile is not read whole
     const bool isWhole = ReadOn(file.number(), out.data(), out.size(), got) && got <= size;
     out.resize(isWhole ? got : 0);

@@ -28,8 +28,7 @@ class FileDescriptor {
     explicit operator bool() const { return number_ >= 0; }
     int number() const { return number_; }
 
-    /// Closes now; false when the system reports that data may be lost.
-    /// An interrupted close has closed.
+    /// Closes now; false when data may be lost. An interrupted close has closed.
     bool close() { return ::close(std::exchange(number_, -1)) == 0 || errno == EINTR; }
 
   private:
@@ -44,8 +43,7 @@ auto RepeatInterrupted(Call call) {
     return result;
 }
 
-/// Opens `path`, relative to the open folder `folder`, which may be AT_FDCWD; with errno when
-/// empty.
+/// Opens `path`, relative to the open folder `folder` or AT_FDCWD; with errno when empty.
 FileDescriptor OpenAt(int folder, const char* path, int flags, mode_t mode = 0);
 
 /// Opens a regular file in the same way to be read, and tells its size.

@@ -154,8 +154,7 @@ bool ReplaceFile(const FileTarget& target, std::span<const std::byte> content, O
         folder, TemporaryName, O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW, exists ? 0600 : 0666);
     if (!temporary) return false;
     Replacement replacement(folder, target.name, std::move(temporary));
-    if (exists && !replacement.takeOver(standing)) return false;
-    if (!replacement.complete(content)) return false;
+    if ((exists && !replacement.takeOver(standing)) || !replacement.complete(content)) return false;
     if (exists && old == Old::Stays && !replacement.giveSecondName(standing)) return false;
     // Some file systems sync no folders and say so.
     return replacement.takePlace() && (Sync(folder) || errno == EINVAL);

@@ -6,13 +6,15 @@
 #include "graph/packed_word.h"
 
 // An edit walks the base graph beside the current one. A node that has become like the base node
-// of the same letters is given up for that one, so edits that take each other back leave nothing
-// behind, and what an edited graph needs is what it differs by.
+// of the same letters is given up for that one, so edits that take each other back leave next to
+// nothing behind, and what an edited graph needs is what it differs by.
 
 namespace Quorle {
 
 namespace {
 
+// Nodes of fewer letters are few and on most paths: once edited they stay.
+constexpr std::size_t KeptDepth = 3;
 // The most edges that one edit appends: each node on the path, with one edge more.
 constexpr std::size_t MostEditedEdges = LongestWord * (2 + std::size_t{Letters});
 
@@ -44,13 +46,11 @@ class Edit {
         step->edge->letters ^= WordEnds;
         step->edge->before += change;
         for (bool goOn = true; goOn && step != path.data();) {
-            const Edge* const edge = step->edge;
+            goOn = step->edge->letters == 0;
             --step;
-            goOn = edge->letters == 0;
-            if (goOn)
-                leaveOut(*step->edge,
-                         LetterBit(word[static_cast<std::size_t>(step - path.data())]));
-            if (joinBase(*step->edge, *step->base)) goOn = true;
+            const auto depth = static_cast<std::size_t>(step - path.data());
+            if (goOn) leaveOut(*step->edge, LetterBit(word[depth]));
+            if (depth >= KeptDepth && joinBase(*step->edge, *step->base)) goOn = true;
         }
     }
 
@@ -70,8 +70,10 @@ class Edit {
             *copy++ = {0, 0, isLast ? CountWords(edges_, to) : wordsBefore};
         }
         std::copy_n(from + place, count - place, copy);
-        std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
-        store_.release(to);
+        if (store_.isEdited(to.first)) {  // base nodes lead to base nodes alone
+            std::for_each_n(from, count, [this](const Edge& child) { store_.hold(child); });
+            store_.release(to);
+        }
         to.first = first;
         to.letters |= bit;
     }
@@ -125,14 +127,14 @@ Edge WordGraph::find(std::string_view letters) const {
 // All memory that an edit can need is asked for before it begins, so that it cannot fail halfway.
 void WordGraph::set(std::string_view word, bool isHeld) {
     assert(!word.empty() && word.size() <= LongestWord && find(word).isWord() != isHeld);
-    auto store = place_ ? place_->store : std::make_shared<EdgeStore>();
-    store->reserve(MostEditedEdges);
     if (place_.use_count() != 1) {
-        place_.reset(new Place{store, root()});
-        store->hold(root());
+        place_.reset(new Place{place_ ? place_->store : std::make_shared<EdgeStore>(), root()});
+        place_->store->hold(root());
     }
+    EdgeStore& store = *place_->store;
+    store.reserve(MostEditedEdges);
     const std::uint32_t change = isHeld ? 1 : ~0U;
-    CountingBits([&] { Edit(*store).toggle(place_->root, word, change); });
+    CountingBits([&] { Edit(store).toggle(place_->root, word, change); });
     size_ += change;
 }
 

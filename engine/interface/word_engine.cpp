@@ -115,9 +115,8 @@ int32_t cReadBinaryDictionary(const char* path) {
 int32_t cWriteBinaryDictionary(const char* path) {
     return Guarded(0, [&] {
         if (path == nullptr) return 0;
-        const Dictionary& dictionary = State.dictionary;
-        return Save(path, EncodeDictionary({dictionary.words(), dictionary.limits.longest})) ? 1
-                                                                                             : 0;
+        const Dictionary& all = State.dictionary;
+        return Save(path, EncodeDictionary({all.words(), all.limits.longest})) ? 1 : 0;
     });
 }
 

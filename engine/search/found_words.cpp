@@ -2,11 +2,12 @@
 
 #include <algorithm>
 #include <numeric>
+#include <span>
 
 namespace Quorle {
 
-// A quarter of a million numbers have three digits of few values each, or two of many, which take
-// longer to add up.
+// A quarter of a million numbers have three digits of few values, or two of many to add up.
+constexpr std::size_t FewWords = 20;
 constexpr unsigned FewBits = 6;
 constexpr unsigned ManyBits = 9;
 constexpr std::size_t ManyWords = 300;
@@ -32,8 +33,10 @@ FoundWord* FoundWords::room(std::size_t most) {
 
 void FoundWords::take(const FoundWord* end, std::uint32_t letters) {
     FoundWord* to = words_.data() + size_;
+    std::uint32_t number = 0;
     for (const FoundWord* word = to; word != end; ++word) {
-        const std::uint32_t number = word->number;
+        if (word->number == number) continue;  // boards of few letters spell a word many times over
+        number = word->number;
         std::uint64_t& known = known_[number / 64];
         *to = {word->path, number, letters};
         to += ~known >> number % 64 & 1;
@@ -59,7 +62,11 @@ void FoundWords::sortByDigits() {
 
 /// Puts the words in order, and gets ready to spell them.
 void FoundWords::finish() {
-    size_ >= ManyWords ? sortByDigits<ManyBits>() : sortByDigits<FewBits>();
+    if (size_ < FewWords) {
+        std::ranges::sort(std::span(words_.data(), size_), {}, &FoundWord::number);
+    } else {
+        size_ < ManyWords ? sortByDigits<FewBits>() : sortByDigits<ManyBits>();
+    }
     std::uint16_t* pair = pairs_.data();
     for (const char first : board_) {
         for (const char second : board_) *pair++ = static_cast<std::uint16_t>(first << 8 | second);

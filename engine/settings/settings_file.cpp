@@ -55,9 +55,8 @@ Parts TakeApart(const std::vector<std::byte>& content, std::string_view start) {
 /// Empty when the player has no home.
 std::filesystem::path SettingsPath() {
     const char* configuration = std::getenv("XDG_CONFIG_HOME");
-    if (configuration != nullptr && *configuration == '/') {
+    if (configuration != nullptr && *configuration == '/')
         return std::filesystem::path(configuration) / "quorle/settings";
-    }
     const char* home = std::getenv("HOME");
     if (home == nullptr || *home == '\0') return {};
     return std::filesystem::path(home) / ".config/quorle/settings";

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cstring>
 #include <new>
 
 #include "word_file/word_text.h"
@@ -25,10 +26,6 @@ using Clock = std::chrono::steady_clock;
 // A piece of work more may follow when the time is up.
 constexpr std::chrono::microseconds StepTime{3500};
 
-bool HasByteOrderMark(const std::vector<std::byte>& text) {
-    return text[0] == std::byte{0xEF} && text[1] == std::byte{0xBB} && text[2] == std::byte{0xBF};
-}
-
 }  // namespace
 
 FileMerge::FileMerge(Dictionary& dictionary, const char* path)
@@ -40,13 +37,11 @@ FileMerge::FileMerge(Dictionary& dictionary, const char* path)
 bool FileMerge::work() {
     if (!file_) return false;
     if (!build_) return readOn();
-    if (isIn_) return build_->builder.giveBack();
-    const bool isUpToDate =
-        dictionary_.words() == build_->base && dictionary_.limits.longest == build_->longest;
-    if (!isUpToDate) return beginAnew();
-    isIn_ = !addWords();
-    if (isIn_) dictionary_.replace(build_->builder.finish());
-    return true;
+    if (dictionary_.words() != build_->base || dictionary_.limits.longest != build_->longest)
+        return beginAnew();
+    if (addWords() || build_->builder.giveBack()) return true;
+    dictionary_.replace(*build_->merged);
+    return false;
 }
 
 double FileMerge::fraction() const {
@@ -63,9 +58,8 @@ bool FileMerge::readOn() {
     const std::size_t size = std::min(left_, BlockSize);
     std::size_t got = 0;
     if (!ReadOn(file_.number(), text_.data() + used_, size, got)) return false;
-    if (left_ == size_ && got >= 3 && HasByteOrderMark(text_)) {
-        std::fill_n(text_.begin(), 3, std::byte{' '});
-    }
+    if (left_ == size_ && got >= 3 && std::memcmp(text_.data(), "\xEF\xBB\xBF", 3) == 0)
+        std::fill_n(text_.begin(), 3, std::byte{' '});  // in place of a byte order mark
     used_ += got;
     takeWords();
     left_ -= got;
@@ -108,7 +102,10 @@ bool FileMerge::addWords() {
     const auto longest = static_cast<std::size_t>(build.longest);
     for (std::size_t i = 0; i < WordsAtOnce; ++i, ++build.added) {
         const PackedWord word = std::min(build.held, build.fresh);
-        if (word == NoWord) return false;
+        if (word == NoWord) {
+            if (!build.merged) build.merged = build.builder.finish();
+            return false;
+        }
         if (word == build.held || LengthOf(word) <= longest) build.builder.add(word);
         if (word == build.fresh) build.fresh = words_.next();
         if (word == build.held) build.held = build.cursor.next();

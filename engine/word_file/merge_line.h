@@ -41,6 +41,7 @@ class FileMerge {
         PackedWord held;   // the next word of the base
         PackedWord fresh;  // the next one of the file
         std::size_t added = 0;
+        std::optional<WordGraph> merged;  // once all words are in
     };
 
     bool readOn();
@@ -56,7 +57,6 @@ class FileMerge {
     std::size_t used_ = 0;
     SortedWords words_;
     std::unique_ptr<Build> build_;  // once all of the file is read
-    bool isIn_ = false;
     int attempts_ = 0;
 };
 
