@@ -4,12 +4,15 @@
 #include <QScreen>
 #include <QTimer>
 #include <chrono>
+#include <clocale>
+#include <future>
 
 #include "app/main_window_events.h"
 #include "app/shutdown.h"
 #include "main_window/main_window.h"
 #include "main_window/tile_picture.h"
 #include "platform/heap.h"
+#include "platform/layout.h"
 #include "platform/legible_style.h"
 #include "platform/platform.h"
 #include "platform/session_end.h"
@@ -28,13 +31,16 @@ constexpr std::chrono::milliseconds AfterFirstPaint{100};
 
 constexpr int PictureCache = 1024;  // KiB
 
+void DrawTile(const Main& window, bool selected) {
+    MainWindow::TilePicture(selected, QString(), window.devicePixelRatioF(),
+                            window.palette().color(QPalette::Window));
+}
+
 void FinishWindow() {
     QIcon icon;
     for (const char* size : {"48", "128"}) icon.addFile(QString(":/quorle-%1.png").arg(size));
     QApplication::setWindowIcon(icon);
-    const Main& window = Windows::Shared<Main>();
-    MainWindow::TilePicture(true, QString(), window.devicePixelRatioF(),
-                            window.palette().color(QPalette::Window));
+    DrawTile(Windows::Shared<Main>(), true);
     Platform::TrimHeap();
 }
 
@@ -45,7 +51,10 @@ int main(int argc, char** argv) {
     Platform::UseDesktop();
     // Every window made anew has its pictures cached once more; ten times this is Qt's own bound.
     QPixmapCache::setCacheLimit(PictureCache);
+    std::setlocale(LC_ALL, "");  // the toolkit would while numbers are read
+    std::future<void> fonts = std::async(Platform::ReadFontList);
     QApplication application(argc, argv);
+    fonts.wait();
     // Before, there would be no desktop yet whose style could be asked for.
     QApplication::setStyle(new LegibleStyle(QApplication::style()));
     // The texts are English and have their places; mirrored, "=>" would point back.
@@ -58,6 +67,7 @@ int main(int argc, char** argv) {
     CentreOnScreen(window);
     Platform::FollowSessionEnd([&window] { window.close(); });
     window.show();
+    DrawTile(window, false);  // while the window manager is at work
     QTimer::singleShot(AfterFirstPaint, &window, FinishWindow);
     const int result = QApplication::exec();
     App::DestroyWindows();

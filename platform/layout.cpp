@@ -1,5 +1,7 @@
 #include "platform/layout.h"
 
+#include <dlfcn.h>
+
 #include <QAbstractButton>
 #include <QAbstractScrollArea>
 #include <QApplication>
@@ -64,6 +66,12 @@ class ReturnKeys : public QObject {
 }  // namespace
 
 namespace Platform {
+
+// The toolkit's own way asks for the application first; where it has no fontconfig, nothing is
+// done.
+void ReadFontList() {
+    if (void* read = dlsym(RTLD_DEFAULT, "FcInit")) reinterpret_cast<int (*)()>(read)();
+}
 
 QFont LayoutFont(Typeface typeface, double points, bool bold) {
     return FontOf(typeface, static_cast<int>(std::lround(points * PixelsPerPoint)), bold);

@@ -32,6 +32,9 @@ constexpr TwipsRect Pixels(int left, int top, int width, int height) {
             height * TwipsPerPixel};
 }
 
+/// Reads which fonts there are, as the first text would. Any thread may, once the locale is set.
+void ReadFontList();
+
 enum class Typeface { SansSerif, Arial, Courier };
 
 /// A font of `points` (72 to the inch, the inch being 96 logical pixels).
