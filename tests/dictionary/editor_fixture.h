@@ -5,6 +5,7 @@
 #include <QComboBox>
 #include <QTest>
 
+#include "platform/platform.h"
 #include "support/program_fixture.h"
 
 class OpenEditor : public ProgramFixture {
@@ -15,22 +16,16 @@ class OpenEditor : public ProgramFixture {
         press("Dictionary");
     }
 
-    QComboBox& prefixes() { return *qobject_cast<QComboBox*>(control("StartingLetters")); }
+    QComboBox& prefixes() { return *control<QComboBox>("StartingLetters"); }
 
     /// The prefixes, the selected one and its words, and the count.
     std::string shown() {
-        QString all;
-        for (int i = 0; i < prefixes().count(); ++i) all += prefixes().itemText(i) + " ";
-        all += "| " + prefixes().currentText() + ":";
-        for (const auto& word : words("DictionaryEditor/WordList")) {
-            all += " " + QString::fromStdString(word);
+        std::string all;
+        for (int i = 0; i < prefixes().count(); ++i) {
+            all += prefixes().itemText(i).toStdString() + " ";
         }
-        return all.toStdString() + " | " + text("WordCount");
-    }
-
-    /// Number of words in the program folder's file; the engine then holds them.
-    int wordsOnDisk() {
-        cReadBinaryDictionary((folder_ / "program/Dictionary.dat").c_str());
-        return cNumberOfWords();
+        all += "| " + prefixes().currentText().toStdString() + ":";
+        for (const auto& word : words("DictionaryEditor/WordList")) all += " " + word;
+        return all + " | " + text("WordCount");
     }
 };

@@ -9,38 +9,29 @@
 
 class BoxAnswers {
   public:
+    using Act = std::function<void(QWidget&)>;
+
     BoxAnswers();
+    ~BoxAnswers();  ///< fails the test when an expected window has not come
 
-    /// The next modal window is a message box with this title, text and buttons;
-    /// `whileUp` runs in front of it, then `answer` is pressed.
-    void expect(const std::string& title, const std::string& text,
-                QMessageBox::StandardButtons buttons, QMessageBox::StandardButton answer,
-                const std::function<void()>& whileUp = {});
-
-    /// The same for a message of the program, and for one of its questions.
-    void expectMessage(const std::string& text, const std::function<void()>& whileUp = {}) {
-        expect("Quorle", text, QMessageBox::Ok, QMessageBox::Ok, whileUp);
-    }
-    void expectQuestion(const std::string& text, QMessageBox::StandardButton answer,
-                        const std::string& title = "Quorle") {
-        expect(title, text, QMessageBox::Yes | QMessageBox::No, answer);
-    }
+    /// The next modal window is a message box with this text, and an OK or a Yes and
+    /// a No; `whileUp` runs in front of it, then `answer` is pressed.
+    void expect(const std::string& text, QMessageBox::StandardButton answer = QMessageBox::Ok,
+                const std::function<void()>& whileUp = {}, const std::string& title = "Quorle");
+    void expectPause(const std::function<void()>& whileUp);
+    void expectSaveQuestion(QMessageBox::StandardButton answer,
+                            const std::function<void()>& whileUp = {});
 
     /// The next modal window is handled by `act`, which has to close it.
-    void expectModal(const std::function<void(QWidget&)>& act);
+    void expectModal(const Act& act) { expected_.push_back(act); }
 
     /// Windows that are not expected are handled by `act` instead of failing the test.
-    void otherwise(const std::function<void(QWidget&)>& act) { otherwise_ = act; }
-
-    /// Fails when an expected window has not come.
-    void verify();
+    void otherwise(const Act& act) { otherwise_ = act; }
 
   private:
     void look();
 
     QTimer timer_;
-    std::deque<std::function<void(QWidget&)>> expected_;
-    bool busy_ = false;
-    int looksInVain_ = 0;
-    std::function<void(QWidget&)> otherwise_;
+    std::deque<Act> expected_;
+    Act otherwise_;
 };

@@ -21,6 +21,9 @@ class GameFixture : public testing::Test {
     /// Writes the program folder's dictionary, and leaves the engine as at start.
     void makeDictionary(const std::vector<std::string>& words, int maximum = 16);
 
+    /// How many words it holds now; the engine then holds them.
+    int wordsInFile() const;
+
     /// The settings file's values; an empty text where there is none.
     static void store(const std::string& name, const std::string& text);
     static std::string stored(const std::string& name);
@@ -32,7 +35,8 @@ class GameFixture : public testing::Test {
     /// Puts letters on the board as a shake would, without a window.
     static void putOnBoard(const std::string& board);
 
-    /// The next shake gives this board. Others are random, from a fixed seed.
+    /// The next shake gives this board of 16 letters, "Q" for the Qu face; fails
+    /// when none can. Others are random, from a fixed seed.
     void shakeNext(const std::string& board);
 
     TempFolder folder_;              ///< home, and below it the program folder

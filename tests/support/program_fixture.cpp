@@ -1,19 +1,13 @@
 #include "support/program_fixture.h"
 
 #include <QAbstractItemView>
-#include <QAction>
-#include <QApplication>
 #include <QClipboard>
 #include <QTest>
-#include <QTimer>
 #include <QTimerEvent>
-#include <stdexcept>
 
 #include "app/main_window_events.h"
 #include "app/shutdown.h"
-#include "main_window/main_window.h"
 #include "platform/platform.h"
-#include "state/windows.h"
 
 namespace {
 
@@ -30,12 +24,13 @@ QWidget* Focus() {
     return QApplication::focusWidget();
 }
 
-}  // namespace
-
-ProgramFixture::~ProgramFixture() {
-    boxes_.verify();
-    endProgram();
+void ClickOn(const QWidget& widget, const QPoint& place) {
+    QWidget* window = widget.window();
+    if (QApplication::activeModalWidget() == nullptr) Activate(*window);
+    QTest::mouseClick(window->windowHandle(), Qt::LeftButton, {}, widget.mapTo(window, place));
 }
+
+}  // namespace
 
 void ProgramFixture::endProgram() {
     Common::DestroyWindows();
@@ -52,8 +47,8 @@ void ProgramFixture::launch() {
     Platform::UseDesktop();
     useTestDesktop();
     Main& window = Common::LoadMainWindow();
-    EXPECT_EQ(clock().interval(), 1000);
-    clock().setInterval(3'600'000);
+    EXPECT_EQ(window.GameClock->interval(), 1000);
+    window.GameClock->setInterval(3'600'000);
     window.show();
     bringToFront("Main");
 }
@@ -63,14 +58,8 @@ void ProgramFixture::start(const std::string& board) {
     press("Start");
 }
 
-void ProgramFixture::clickOn(const QWidget& widget, const QPoint& place, Qt::MouseButton button) {
-    QWidget* window = widget.window();
-    if (QApplication::activeModalWidget() == nullptr) Activate(*window);
-    QTest::mouseClick(window->windowHandle(), button, {}, widget.mapTo(window, place));
-}
-
 void ProgramFixture::press(const std::string& button) {
-    clickOn(*control(button), control(button)->rect().center(), Qt::LeftButton);
+    ClickOn(*control(button), control(button)->rect().center());
 }
 
 void ProgramFixture::type(const std::string& text) {
@@ -101,11 +90,6 @@ void ProgramFixture::paste(const std::string& text) {
     key(Qt::Key_V, Qt::ControlModifier);
 }
 
-void ProgramFixture::click(int tile, Qt::MouseButton button) {
-    const QWidget& clicked = *control("Cube" + std::to_string(tile));
-    clickOn(clicked, clicked.rect().center(), button);
-}
-
 void ProgramFixture::clickTiles(const Tiles& tiles) {
     for (const int tile : tiles) click(tile);
 }
@@ -117,18 +101,12 @@ void ProgramFixture::doubleClick(int tile) {
 }
 
 void ProgramFixture::select(const std::string& list, const std::string& word) {
-    QAbstractItemView& shown = view(list);
+    auto& shown = *control<QAbstractItemView>(list);
     const auto found = shown.model()->match(shown.model()->index(0, 0), Qt::DisplayRole,
                                             QString::fromStdString(word), 1, Qt::MatchExactly);
     if (found.isEmpty()) throw std::logic_error(list + " has no " + word);
     shown.scrollTo(found.first());
-    clickOn(*shown.viewport(), shown.visualRect(found.first()).center(), Qt::LeftButton);
-}
-
-void ProgramFixture::menu(const std::string& command) {
-    const auto slash = command.find('/');
-    const auto name = QString::fromStdString(command.substr(slash + 1));
-    control(command.substr(0, slash))->findChild<QAction*>(name)->trigger();
+    ClickOn(*shown.viewport(), shown.visualRect(found.first()).center());
 }
 
 void ProgramFixture::bringToFront(const std::string& window) {
@@ -136,7 +114,9 @@ void ProgramFixture::bringToFront(const std::string& window) {
 }
 
 bool ProgramFixture::comesToFront(const std::string& window) {
-    return QTest::qWaitForWindowActive(control(window), 2000);
+    // Not QTest's own wait: to it a window is active when one that it owns is.
+    const auto inFront = [&] { return QApplication::activeWindow() == control(window); };
+    return QTest::qWaitFor(inFront, 2000);
 }
 
 void ProgramFixture::closeByTitleBar(const std::string& window) {
@@ -145,42 +125,15 @@ void ProgramFixture::closeByTitleBar(const std::string& window) {
 }
 
 void ProgramFixture::tick(int times) {
-    for (int i = 0; i < times && clock().isActive(); ++i) {
-        QTimerEvent event(clock().timerId());
-        QCoreApplication::sendEvent(&clock(), &event);
+    auto& clock = *control<QTimer>("GameClock");
+    for (int i = 0; i < times && clock.isActive(); ++i) {
+        QTimerEvent event(clock.timerId());
+        QCoreApplication::sendEvent(&clock, &event);
     }
-}
-
-QTimer& ProgramFixture::clock() {
-    auto* found = control("Main")->findChild<QTimer*>("GameClock");
-    if (found == nullptr) throw std::logic_error("no clock");
-    return *found;
-}
-
-QWidget* ProgramFixture::find(const std::string& name) {
-    const auto slash = name.find('/');
-    const QString window =
-        QString::fromStdString(slash == name.npos ? "Main" : name.substr(0, slash));
-    const QString wanted = QString::fromStdString(name.substr(slash + 1));
-    QWidget* elsewhere = nullptr;
-    for (QWidget* top : QApplication::topLevelWidgets()) {
-        if (top->objectName() == wanted) return top;
-        auto* found = top->findChild<QWidget*>(wanted);
-        if (found == nullptr) continue;
-        if (top->objectName() == window) return found;
-        if (slash == name.npos) elsewhere = found;
-    }
-    return elsewhere;
-}
-
-QWidget* ProgramFixture::control(const std::string& name) {
-    QWidget* found = find(name);
-    if (found == nullptr) throw std::logic_error("no control " + name);
-    return found;
 }
 
 bool ProgramFixture::isShown(const std::string& window) {
-    const QWidget* found = find(window);
+    const auto* found = find<QWidget>(window);
     return found != nullptr && found->isVisible();
 }
 
@@ -191,10 +144,9 @@ std::string ProgramFixture::text(const std::string& name) {
 }
 
 std::string ProgramFixture::entry() {
-    std::string all = typed() + " [";
-    for (const int tile : litTiles()) all += std::to_string(tile) + " ";
-    if (all.back() == ' ') all.pop_back();
-    return all + "] " + std::to_string(warnings_);
+    std::string lit;
+    for (const int tile : litTiles()) lit += (lit.empty() ? "" : " ") + std::to_string(tile);
+    return typed() + " [" + lit + "] " + std::to_string(warnings_);
 }
 
 std::string ProgramFixture::summary() {
@@ -205,13 +157,13 @@ std::string ProgramFixture::letters(const std::string& tiles) {
     std::string all;
     for (int k = 0; k < CubeCount; ++k) {
         const QString letter = control(tiles + std::to_string(k))->accessibleName();
-        all += letter.isEmpty() ? "." : letter.toStdString();
+        all += letter.isEmpty() ? '.' : letter.front().toLatin1();
     }
     return all;
 }
 
 Words ProgramFixture::words(const std::string& list, bool struckOnly) {
-    const QAbstractItemModel& model = *view(list).model();
+    const QAbstractItemModel& model = *control<QAbstractItemView>(list)->model();
     Words all;
     for (int row = 0; row < model.rowCount(); ++row) {
         const QModelIndex cell = model.index(row, 0);
@@ -221,13 +173,7 @@ Words ProgramFixture::words(const std::string& list, bool struckOnly) {
     return all;
 }
 
-QAbstractItemView& ProgramFixture::view(const std::string& list) {
-    auto* found = qobject_cast<QAbstractItemView*>(control(list));
-    if (found == nullptr) throw std::logic_error("no list " + list);
-    return *found;
-}
-
-Tiles ProgramFixture::lit(const std::string& tiles) {
+Tiles ProgramFixture::litTiles(const std::string& tiles) {
     Tiles found;
     for (int k = 0; k < CubeCount; ++k) {
         if (control(tiles + std::to_string(k))->property("selected").toBool()) found.push_back(k);

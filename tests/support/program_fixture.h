@@ -2,22 +2,23 @@
 // The real program, offscreen, used as a player uses it: keys go where the focus
 // is, mouse clicks to whatever is on top. Controls go by their names, those of the
 // main window first; "Results/ResultsOK" is the one in that window.
-#include <QWidget>
+#include <QAction>
+#include <QApplication>
+#include <stdexcept>
 #include <string>
 #include <vector>
 
+#include "main_window/main_window.h"
+#include "state/windows.h"
 #include "support/box_answers.h"
 #include "support/game_fixture.h"
-
-class QAbstractItemView;
-class QTimer;
 
 using Tiles = std::vector<int>;
 using Words = std::vector<std::string>;
 
 class ProgramFixture : public GameFixture {
   protected:
-    ~ProgramFixture() override;
+    ~ProgramFixture() override { endProgram(); }
 
     /// Starts the program and shows its main window, in front.
     /// From then on the clock fires only when the test says so.
@@ -28,47 +29,60 @@ class ProgramFixture : public GameFixture {
     static void endProgram();
 
     // What the player does.
-    void start(const std::string& board);   ///< presses Start
-    void press(const std::string& button);  ///< by mouse
-    void type(const std::string& text);     ///< key by key
+    void start(const std::string& board = "CATSBONEWILDHEFY");  ///< presses Start
+    void press(const std::string& button);                      ///< by mouse
+    void type(const std::string& text);                         ///< key by key
     void key(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void enter(const Words& words);  ///< types each, and Return
     void paste(const std::string& text);
     void replaceAll(const std::string& text);  ///< selects all, then pastes or deletes
-    void click(int tile, Qt::MouseButton button = Qt::LeftButton);
+    void click(int tile) { press("Cube" + std::to_string(tile)); }
     void clickTiles(const Tiles& tiles);
     void doubleClick(int tile);
     void select(const std::string& list, const std::string& word);  ///< by mouse
-    void menu(const std::string& command);                          ///< "HelpBrowser/Back"
+    void menu(const std::string& command) { control<QAction>(command)->trigger(); }
     void bringToFront(const std::string& window);
     void closeByTitleBar(const std::string& window);
     void tick(int times = 1);  ///< the clock fires, if it runs
 
     // What the player sees.
-    QWidget* control(const std::string& name);     ///< fails the test when missing
     bool comesToFront(const std::string& window);  ///< now or soon
     bool isShown(const std::string& window);
     std::string text(const std::string& control);  ///< of a label, box or button
     std::string typed() { return text("NewWord"); }
-    Tiles litTiles() { return lit("Cube"); }
-    Tiles litResults() { return lit("ResultCubes"); }
-    std::string letters(const std::string& tiles = "Cube");  ///< blank tiles: "."
+    Tiles litTiles(const std::string& tiles = "Cube");
+    Tiles litResults() { return litTiles("ResultCubes"); }
+    std::string letters(const std::string& tiles = "Cube");  ///< "Q" for Qu, "." for blank
     std::string entry();  ///< the word typed, the tiles lit, the warnings: "cat [0 1 2] 0"
     std::string typing(const std::string& text) { return type(text), entry(); }
     std::string clicking(const Tiles& tiles) { return clickTiles(tiles), entry(); }
     std::string clearing() { return press("Clear"), entry(); }
     std::string summary();  ///< the lines under the results
     Words words(const std::string& list = "WordList", bool struckOnly = false);
-    Words struck() { return words("WordList", true); }
+
+    template <class Control = QWidget>
+    Control* control(const std::string& name) {  ///< fails the test when missing
+        auto* found = find<Control>(name);
+        if (found == nullptr) throw std::logic_error("no control " + name);
+        return found;
+    }
 
     BoxAnswers boxes_;
 
   private:
-    static void clickOn(const QWidget& widget, const QPoint& place, Qt::MouseButton button);
-    QWidget* find(const std::string& name);
-    QTimer& clock();
-    QAbstractItemView& view(const std::string& list);
-    Tiles lit(const std::string& tiles);
+    template <class Control>
+    static Control* find(const std::string& name) {
+        const QString path = QString::fromStdString(name);
+        const QString window = path.section('/', 0, -2);
+        const QString wanted = path.section('/', -1);
+        for (QWidget* top :
+             QWidgetList{Windows::Existing<Main>} + QApplication::topLevelWidgets()) {
+            if (!window.isEmpty() && top->objectName() != window) continue;
+            if (top->objectName() == wanted) return qobject_cast<Control*>(top);
+            if (auto* found = top->findChild<Control*>(wanted)) return found;
+        }
+        return nullptr;
+    }
 };
 
 /// The program in front, on a small dictionary.
