@@ -22,11 +22,8 @@ unsigned FromEnvironment(const char* name, unsigned otherwise) {
 constexpr const char* Editor = "DictionaryEditor";
 constexpr const char* EditorList = "DictionaryEditor/WordList";
 
-/// Something to do where this window or control is on show and can be used.
-struct Action {
-    std::string where;
-    std::function<void()> act;
-};
+/// Where the player acts, if this window or control is on show and can be used; and what.
+using Action = std::pair<std::string, std::function<void()>>;
 
 class WildPlayer : public PlayedBoard {
   protected:
@@ -42,7 +39,7 @@ class WildPlayer : public PlayedBoard {
         boxes_.otherwise([this](QWidget& box) { answer(box); });
         enterWords();
         useWindows();
-        relaunch();
+        launch();
     }
 
     int below(int n) { return static_cast<int>(random_() % static_cast<unsigned>(n)); }
@@ -62,20 +59,20 @@ class WildPlayer : public PlayedBoard {
     void can(std::size_t weight, const std::string& where, const std::function<void()>& act) {
         actions_.insert(actions_.end(), weight, {where, act});
     }
-    void perform(const Action& action) {
-        if (!isShown(action.where) || !control(action.where)->isEnabled()) return;
-        bringToFront(action.where);
-        if (control(action.where)->focusPolicy() != Qt::NoFocus) control(action.where)->setFocus();
-        action.act();
+    void perform(const std::string& where, const std::function<void()>& act) {
+        if (!isShown(where) || !control(where)->isEnabled()) return;
+        bringToFront(where);
+        if (control(where)->focusPolicy() != Qt::NoFocus) control(where)->setFocus();
+        act();
     }
     void play(unsigned actions) {
         std::string done;
         while (actions-- > 0 && !HasFailure()) {
-            const Action& action = oneOf(actions_);
-            done = (action.where + " " + done).substr(0, 300);
+            const auto& [where, act] = oneOf(actions_);
+            done = (where + " " + done).substr(0, 300);
             SCOPED_TRACE(std::to_string(actions) + " actions before the end, after " + done);
             EXPECT_NO_THROW({
-                perform(action);
+                perform(where, act);
                 check();
             });
         }
@@ -98,7 +95,7 @@ class WildPlayer : public PlayedBoard {
     }
 
     void enterWords() {
-        can(30, "NewWord", [this] { typeLetter(); });
+        can(30, "NewWord", [this] { type(letter()); });
         can(5, "NewWord", [this] { type(randomText(3)); });
         can(5, "NewWord", [this] { paste(randomText(30)); });
         can(1, "NewWord", [this] { paste(std::string(30'000, "ae\n"[below(3)])); });
@@ -108,18 +105,7 @@ class WildPlayer : public PlayedBoard {
             can(4, "NewWord", [=, this] { key(pressed); });
         }
         can(40, "Main", [this] { click(below(16)); });
-        can(5, "Main", [this] { doubleClick(below(16)); });
-    }
-    /// What lies on the board is lit by its first chain, unless it was clicked.
-    void typeLetter() {
-        const std::string before = typed();
-        type(letter());
-        if (typed() == before || typed().empty() || typed() == State.PickedWord) return;
-        const std::vector<Chain> chains = ChainsOf(letters(), typed());
-        if (chains.empty()) return;  // for checkWord
-        Tiles first = chains.front();
-        std::sort(first.begin(), first.end());
-        EXPECT_EQ(litTiles(), first) << typed() << " on " << letters();
+        can(5, "Main", [this] { doubleClick(below(16)), untraced_ = typed(); });
     }
     void useWindows() {
         for (const char* button :
@@ -165,7 +151,7 @@ class WildPlayer : public PlayedBoard {
             if (below(3) > 0) return;
             press("Exit");
             EXPECT_FALSE(isShown("Main"));
-            relaunch();
+            launch();
         });
     }
 
@@ -206,7 +192,11 @@ class WildPlayer : public PlayedBoard {
         } else if (typed() != untraced_) {
             // A text that equalled the clicks stays when it is submitted and too short.
             untraced_.clear();
-            ASSERT_FALSE(ChainsOf(letters(), typed()).empty()) << typed() << " on " << letters();
+            const std::vector<Chain> chains = ChainsOf(letters(), typed());
+            ASSERT_FALSE(chains.empty()) << typed() << " on " << letters();
+            Tiles first = chains.front();
+            std::sort(first.begin(), first.end());
+            EXPECT_EQ(litTiles(), first) << typed() << " on " << letters();
         }
     }
     Words sorted(const std::string& list) {

@@ -53,20 +53,13 @@ TEST_F(StartAndExit, AStoredMaximumBelowTheDictionarysIsAsked) {
             "from the dictionary?",
             answer);
         if (!remove) boxes_.expect("Setting Max Word Size option to 16 letters");
-        relaunch();
+        launch();
         EXPECT_EQ(cMaxWordSize(), remove ? 3 : 16);
         EXPECT_EQ(cNumberOfWords(), remove ? 1 : 2);
         if (remove) boxes_.expectSaveQuestion(QMessageBox::No);
         press("Exit");
         EXPECT_EQ(wordsInFile(), 2);
     }
-}
-
-TEST_F(StartAndExit, ADamagedDictionaryIsAnEmptyOne) {
-    folder_.write("program/Dictionary.dat", "no dictionary");
-    launch();
-    start();
-    EXPECT_EQ(text("DefinedWordCount"), "Quorle found 0 words");
 }
 
 TEST_F(StartAndExit, AChangeIsSavedOrDropped) {
@@ -81,7 +74,7 @@ TEST_F(StartAndExit, AChangeIsSavedOrDropped) {
 
     makeDictionary({"cat"}, 12);
     store("TimeLimit", "60");
-    relaunch();
+    launch();
     changeDictionary();
     cSetMaxWordSize(5);
     boxes_.expectSaveQuestion(QMessageBox::No);

@@ -1,6 +1,5 @@
 // One game from Start to its end, and the clock.
 #include <QTest>
-#include <QTimer>
 
 #include "platform/platform.h"
 #include "support/program_fixture.h"
@@ -14,7 +13,7 @@ class GameFlow : public PlayedBoard {
 
 TEST_F(GameFlow, AWholeGameRunsOut) {
     State.TimeLimit = 15;
-    start("CATSBONEWILDHEFY");
+    start();
     EXPECT_EQ(times(), "Time Remaining 0:15");
     EXPECT_EQ(text("DefinedWordCount"), "Quorle found 7 words");
     enter({"cat"});
@@ -27,11 +26,10 @@ TEST_F(GameFlow, AWholeGameRunsOut) {
     EXPECT_TRUE(isShown("Results"));
     EXPECT_EQ(words(), Words{"cat"});
     EXPECT_EQ(entry(), " [] 0");
-    EXPECT_FALSE(control("NewWord")->isEnabled());
 }
 
 TEST_F(GameFlow, StartDropsARunningGame) {
-    start("CATSBONEWILDHEFY");
+    start();
     enter({"cat"});
     clickTiles({4, 5});
     tick(5);
@@ -42,15 +40,14 @@ TEST_F(GameFlow, StartDropsARunningGame) {
 }
 
 TEST_F(GameFlow, APauseHidesTheBoardAndCostsNoTime) {
-    start("CATSBONEWILDHEFY");
+    start();
     tick();
     type("ca");
-    boxes_.expect("Game paused", "Hit OK when ready to resume.", QMessageBox::Ok, QMessageBox::Ok,
-                  [this] {
-                      EXPECT_FALSE(isShown("CubeFrame"));
-                      tick(3);
-                      click(2);  // the box is modal
-                  });
+    boxes_.expectPause([this] {
+        EXPECT_FALSE(isShown("CubeFrame"));
+        tick(3);
+        click(2);  // the box is modal
+    });
     press("Pause");
     EXPECT_TRUE(isShown("CubeFrame"));
     EXPECT_EQ(times(), "Time Remaining 2:59");
@@ -59,20 +56,16 @@ TEST_F(GameFlow, APauseHidesTheBoardAndCostsNoTime) {
 }
 
 TEST_F(GameFlow, TheClockCountsOnlyWithItsWindowInFront) {
-    const auto inFront = Platform::WindowInFront;
-    start("CATSBONEWILDHEFY");
-    Platform::WindowInFront = [] { return 0; };
+    start();
+    const auto inFront = std::exchange(Platform::WindowInFront, [] { return 0; });
     tick();  // no window of ours: counts, and records none
-    EXPECT_EQ(State.ClockWindow, 0);
     Platform::WindowInFront = inFront;
-    boxes_.expectMessage("Wait.", [this] { tick(2); });
+    boxes_.expect("Wait.", QMessageBox::Ok, [this] { tick(2); });
     Platform::ShowMessage("Wait.", "Quorle");  // stands for its window once, when that is recorded
-    EXPECT_EQ(State.ClockWindow, 1);
     EXPECT_EQ(times(), "Time Remaining 2:58");
     for (const bool closed : {true, false}) {
-        bringToFront("Main");
-        press("End");
-        start("CATSBONEWILDHEFY");
+        press("Main/End");
+        start();
         bringToFront("Results");
         tick(3);
         EXPECT_EQ(times(), "Time Remaining 3:00");
@@ -85,10 +78,8 @@ TEST_F(GameFlow, TheClockCountsOnlyWithItsWindowInFront) {
 }
 
 TEST_F(GameFlow, TheRealClockFires) {
-    auto& timer = *control("Main")->findChild<QTimer*>("GameClock");
-    timer.setInterval(1000);
-    EXPECT_EQ(timer.timerType(), Qt::PreciseTimer);
-    start("CATSBONEWILDHEFY");
+    control<QTimer>("GameClock")->setInterval(1000);
+    start();
     EXPECT_TRUE(QTest::qWaitFor([&] { return times() == "Time Remaining 2:59"; }, 10000));
 }
 

@@ -1,8 +1,7 @@
 #include <quorle/word_engine.h>
 
-#include <QCheckBox>
 #include <QComboBox>
-#include <QLineEdit>
+#include <map>
 
 #include "support/program_fixture.h"
 
@@ -17,75 +16,63 @@ class OptionsTest : public ProgramFixture {
         press("Options");
     }
 
-    /// Chooses in the three boxes where a text is given, and presses OK.
-    void apply(const char* time, const char* minimum, const char* maximum) {
+    /// Chooses in the boxes named and presses a button.
+    void choose(const std::map<std::string, const char*>& choices, const char* button) {
         press("Options");
-        choose("TimeCombo", time);
-        choose("MinWordSizeCombo", minimum);
-        choose("WordSizeCombo", maximum);
-        press("OKButton");
-    }
-    void choose(const char* box, const char* entry) {
-        if (*entry != 0) control<QComboBox>(box)->setCurrentText(entry);
+        for (const auto& [box, entry] : choices) control<QComboBox>(box)->setCurrentText(entry);
+        press(button);
     }
     static std::string settings() {
         return std::to_string(State.TimeLimit) + " " + std::to_string(cMinWordSize()) + " " +
                std::to_string(cMaxWordSize()) + " " + std::to_string(State.Sounds);
     }
-    static std::string allStored() {
-        return stored("TimeLimit") + " " + stored("MinWordSize") + " " + stored("MaxWordSize") +
-               " " + stored("Sounds");
-    }
 };
 
 TEST_F(OptionsTest, CancelAppliesNothingAndKeepsTheChoicesForOK) {
-    choose("TimeCombo", "4:00");
-    press("CancelButton");
-    press("Options");
-    choose("MinWordSizeCombo", "16 letters");
-    control<QCheckBox>("SoundsOption")->click();
+    choose({{"TimeCombo", "4:00"}}, "CancelButton");
+    choose({{"MinWordSizeCombo", "16 letters"}}, "SoundsOption");
     closeByTitleBar("OptionsDialog");
-    EXPECT_EQ(settings(), "180 2 16 -1");
-    EXPECT_EQ(allStored(), " 2  ");
-    press("Options");
-    press("OKButton");
+    EXPECT_EQ(settings() + stored("TimeLimit"), "180 2 16 -1");
+    choose({}, "OKButton");
     EXPECT_FALSE(isShown("OptionsDialog"));
-    EXPECT_EQ(settings(), "240 16 16 0");
-    EXPECT_EQ(allStored(), "240 16 16 0");
+    EXPECT_EQ(settings() + "/" + stored("TimeLimit"), "240 16 16 0/240");
     start();
     EXPECT_EQ(text("TimeLeft"), "4:00");
 }
 
 TEST_F(OptionsTest, AnotherMinimumStopsTheGameOnlyWhenThePlayerAgrees) {
     start();
-    for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
+    for (const bool agrees : {false, true}) {
         boxes_.expect(
             "Changing the minimum word size now will stop the current game.  Are you sure you want "
             "to do this?",
-            answer);
-        apply("5:00", "4 letters", answer == QMessageBox::No ? "8 letters" : "");
-        EXPECT_EQ(settings(), answer == QMessageBox::No ? "300 2 16 -1" : "300 4 16 -1");
+            agrees ? QMessageBox::Yes : QMessageBox::No);
+        choose({{"TimeCombo", "5:00"},
+                {"MinWordSizeCombo", "4 letters"},
+                {"WordSizeCombo", agrees ? "16 letters" : "8 letters"}},
+               "OKButton");
+        EXPECT_EQ(settings(), agrees ? "300 4 16 -1" : "300 2 16 -1");
         EXPECT_FALSE(isShown("Results"));
         bringToFront("Main");
         tick();
-        EXPECT_EQ(isShown("Results"), answer == QMessageBox::Yes);
+        EXPECT_EQ(isShown("Results"), agrees);
     }
-    apply("", "5 letters", "");  // no game: nothing is asked
+    choose({{"MinWordSizeCombo", "5 letters"}}, "OKButton");  // no game: nothing is asked
 }
 
 TEST_F(OptionsTest, ASmallerMaximumRemovesWordsOnlyWhenThePlayerAgrees) {
-    for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
+    for (const bool agrees : {false, true}) {
         EXPECT_EQ(cNumberOfWords(), 3);
         EXPECT_FALSE(State.DictionaryChanged);
         boxes_.expect(
             "Are you sure you want to remove words longer than 8 letters from the dictionary?",
-            answer);
-        apply("", "", "8 letters");
-        EXPECT_EQ(stored("MaxWordSize"), answer == QMessageBox::No ? "16" : "8");
+            agrees ? QMessageBox::Yes : QMessageBox::No);
+        choose({{"WordSizeCombo", "8 letters"}}, "OKButton");
+        EXPECT_EQ(stored("MaxWordSize"), agrees ? "8" : "16");
     }
     EXPECT_EQ(cNumberOfWords(), 2);
     EXPECT_TRUE(State.DictionaryChanged);
-    apply("", "", "9 letters");
+    choose({{"WordSizeCombo", "9 letters"}}, "OKButton");
     EXPECT_EQ(cMaxWordSize(), 9);
 }
 

@@ -9,8 +9,7 @@
 namespace {
 
 std::string TextOf(const QWidget& window) {
-    const auto* box = qobject_cast<const QMessageBox*>(&window);
-    return (box == nullptr ? window.objectName() : box->text()).toStdString();
+    return window.property("text").toString().toStdString();
 }
 
 }  // namespace
@@ -38,16 +37,6 @@ void BoxAnswers::expect(const std::string& text, QMessageBox::StandardButton ans
         ASSERT_NE(box->button(answer), nullptr);
         QTest::mouseClick(box->button(answer), Qt::LeftButton);
     });
-}
-
-void BoxAnswers::expectPause(const std::function<void()>& whileUp) {
-    expect("Hit OK when ready to resume.", QMessageBox::Ok, whileUp, "Game paused");
-}
-
-void BoxAnswers::expectSaveQuestion(QMessageBox::StandardButton answer,
-                                    const std::function<void()>& whileUp) {
-    expect("Dictionary has been updated, do you want to save it?", answer, whileUp,
-           "Save dictionary?");
 }
 
 // What a test leaves open would hold it for ever, so it is closed, also what no key

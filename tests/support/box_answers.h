@@ -18,9 +18,14 @@ class BoxAnswers {
     /// a No; `whileUp` runs in front of it, then `answer` is pressed.
     void expect(const std::string& text, QMessageBox::StandardButton answer = QMessageBox::Ok,
                 const std::function<void()>& whileUp = {}, const std::string& title = "Quorle");
-    void expectPause(const std::function<void()>& whileUp);
+    void expectPause(const std::function<void()>& whileUp) {
+        expect("Hit OK when ready to resume.", QMessageBox::Ok, whileUp, "Game paused");
+    }
     void expectSaveQuestion(QMessageBox::StandardButton answer,
-                            const std::function<void()>& whileUp = {});
+                            const std::function<void()>& whileUp = {}) {
+        expect("Dictionary has been updated, do you want to save it?", answer, whileUp,
+               "Save dictionary?");
+    }
 
     /// The next modal window is handled by `act`, which has to close it.
     void expectModal(const Act& act) { expected_.push_back(act); }

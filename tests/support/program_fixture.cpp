@@ -18,12 +18,6 @@ void Activate(QWidget& window) {
     if (!QTest::qWaitForWindowActive(&window)) throw std::logic_error("not in front");
 }
 
-QWidget* Focus() {
-    const auto given = [] { return QApplication::focusWidget() != nullptr; };
-    if (!QTest::qWaitFor(given, 2000)) throw std::logic_error("nothing has the focus");
-    return QApplication::focusWidget();
-}
-
 void ClickOn(const QWidget& widget, const QPoint& place) {
     QWidget* window = widget.window();
     if (QApplication::activeModalWidget() == nullptr) Activate(*window);
@@ -37,13 +31,9 @@ void ProgramFixture::endProgram() {
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 }
 
-void ProgramFixture::relaunch() {
+void ProgramFixture::launch() {
     endProgram();
     resetProcess();
-    launch();
-}
-
-void ProgramFixture::launch() {
     Platform::UseDesktop();
     useTestDesktop();
     Main& window = Common::LoadMainWindow();
@@ -64,13 +54,13 @@ void ProgramFixture::press(const std::string& button) {
 
 void ProgramFixture::type(const std::string& text) {
     for (const char32_t letter : QString::fromStdString(text).toStdU32String()) {
-        QTest::sendKeyEvent(QTest::Click, Focus(), Qt::Key_unknown, QString::fromUcs4(&letter, 1),
-                            Qt::NoModifier);
+        QTest::sendKeyEvent(QTest::Click, QApplication::focusWindow(), Qt::Key_unknown,
+                            QString::fromUcs4(&letter, 1), Qt::NoModifier);
     }
 }
 
 void ProgramFixture::key(Qt::Key key, Qt::KeyboardModifiers modifiers) {
-    QTest::keyClick(Focus(), key, modifiers);
+    QTest::keyClick(QApplication::focusWindow(), key, modifiers);
 }
 
 void ProgramFixture::enter(const Words& entered) {
@@ -137,8 +127,8 @@ bool ProgramFixture::isShown(const std::string& window) {
     return found != nullptr && found->isVisible();
 }
 
-std::string ProgramFixture::text(const std::string& name) {
-    const QVariant text = control(name)->property("text");
+std::string ProgramFixture::text(const std::string& name, const char* property) {
+    const QVariant text = control(name)->property(property);
     if (!text.isValid()) throw std::logic_error("no text on " + name);
     return text.toString().toStdString();
 }
@@ -156,8 +146,8 @@ std::string ProgramFixture::summary() {
 std::string ProgramFixture::letters(const std::string& tiles) {
     std::string all;
     for (int k = 0; k < CubeCount; ++k) {
-        const QString letter = control(tiles + std::to_string(k))->accessibleName();
-        all += letter.isEmpty() ? '.' : letter.front().toLatin1();
+        const std::string letter = text(tiles + std::to_string(k), "accessibleName");
+        all += letter.empty() ? '.' : letter[0];
     }
     return all;
 }

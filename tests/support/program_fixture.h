@@ -20,12 +20,9 @@ class ProgramFixture : public GameFixture {
   protected:
     ~ProgramFixture() override { endProgram(); }
 
-    /// Starts the program and shows its main window, in front.
-    /// From then on the clock fires only when the test says so.
+    /// Starts the program as a new process would, ending one that runs, and shows its main
+    /// window, in front. From then on the clock fires only when the test says so.
     void launch();
-
-    /// The program ends, and starts again as a new process would.
-    void relaunch();
     static void endProgram();
 
     // What the player does.
@@ -48,7 +45,8 @@ class ProgramFixture : public GameFixture {
     // What the player sees.
     bool comesToFront(const std::string& window);  ///< now or soon
     bool isShown(const std::string& window);
-    std::string text(const std::string& control);  ///< of a label, box or button
+    std::string text(const std::string& control, const char* property = "text");
+    std::string description(const std::string& of) { return text(of, "accessibleDescription"); }
     std::string typed() { return text("NewWord"); }
     Tiles litTiles(const std::string& tiles = "Cube");
     Tiles litResults() { return litTiles("ResultCubes"); }
@@ -92,4 +90,10 @@ class PlayedBoard : public ProgramFixture {
         makeDictionary({"bone", "cast", "cat", "cats", "coat", "ten", "toe", "tone", "won"});
         launch();
     }
+};
+
+/// A game under way on it.
+class RunningGame : public PlayedBoard {
+  protected:
+    RunningGame() { start(); }
 };
