@@ -14,11 +14,6 @@
 
 namespace {
 
-unsigned FromEnvironment(const char* name, unsigned otherwise) {
-    const char* given = std::getenv(name);
-    return given == nullptr ? otherwise : static_cast<unsigned>(std::strtoul(given, nullptr, 10));
-}
-
 constexpr const char* Editor = "DictionaryEditor";
 constexpr const char* EditorList = "DictionaryEditor/WordList";
 
@@ -28,7 +23,8 @@ using Action = std::pair<std::string, std::function<void()>>;
 class WildPlayer : public PlayedBoard {
   protected:
     WildPlayer() {
-        const unsigned seed = FromEnvironment("QUORLE_SEED", std::random_device()());
+        const QString any = QString::number(std::random_device()());
+        const unsigned seed = qEnvironmentVariable("QUORLE_SEED", any).toUInt();
         std::cout << "QUORLE_SEED=" << seed << std::endl;
         random_.seed(seed);
         folder_.write("program/Quorle.htm", "<p><a href=\"Quorle.htm#end\">more</a> <p>Help");
@@ -49,8 +45,7 @@ class WildPlayer : public PlayedBoard {
     }
     std::string letter() { return {static_cast<char>(oneOf(letters()) | 0x20)}; }
     std::string randomText(int longest) {
-        const Words odd{"A",  " ",  ".",        "\xC3\xA9",     "\x01",
-                        "\n", "\t", "\xD7\xA9", "\xE2\x80\xAE", "\xF0\x9F\x98\x80"};
+        const Words odd{"A", " ", "\xC3\xA9", "\x01", "\n", "\xE2\x80\xAE", "\xF0\x9F\x98\x80"};
         std::string text;
         for (int i = below(longest); i >= 0; --i) text += below(12) == 0 ? oneOf(odd) : letter();
         return text;
@@ -143,10 +138,7 @@ class WildPlayer : public PlayedBoard {
             });
         }
         can(4, "DictionaryEditor/NewWord", [this] { enter({randomText(5)}); });
-        can(1, Editor, [this] { key(Qt::Key_Escape); });
-        for (const char* place : {"NewWord", "Results"}) {
-            can(10, place, [this] { seconds_ += below(4), tick(below(15)); });
-        }
+        can(20, "Main", [this] { seconds_ += below(4), tick(below(15)); });
         can(1, "Exit", [this] {
             if (below(3) > 0) return;
             press("Exit");
@@ -211,7 +203,7 @@ class WildPlayer : public PlayedBoard {
 };
 
 TEST_F(WildPlayer, NeverLeavesTheGameInDisorder) {
-    play(FromEnvironment("QUORLE_ACTIONS", 1000));
+    play(qEnvironmentVariable("QUORLE_ACTIONS", "1000").toUInt());
     EXPECT_TRUE(QTest::qWaitFor([this] { return !isShown("Progress"); }, 60'000));
     press("Main/Exit");
     endProgram();

@@ -1,5 +1,8 @@
-// Building a word by keys and clicks.
+// Building a word by keys and clicks, and submitting it.
+#include <quorle/word_engine.h>
+
 #include <QMouseEvent>
+#include <QTableWidget>
 
 #include "support/program_fixture.h"
 
@@ -30,7 +33,7 @@ TEST_F(WordEntry, TypingLightsTheChainAndTakesTheRestOff) {
 
 TEST_F(WordEntry, QuIsOneCube) {
     start("QITAKENSHORDGLUB");
-    EXPECT_EQ(control("Cube0")->accessibleName() + control("Cube1")->accessibleName(), "QuI");
+    EXPECT_EQ(control("Cube0")->accessibleName(), "Qu");
     EXPECT_EQ(typing("q"), "q [0] 0");
     EXPECT_EQ(typing("uit"), "quit [0 1 2] 0");
     key(Qt::Key_Home);
@@ -83,10 +86,12 @@ TEST_F(WordEntry, ClearTakesBackTheLastClickOrLetter) {
     EXPECT_EQ(clearing(), "ca [0 1] 0");
     // in step again, and clicked last: submitted, but too short
     EXPECT_EQ(clicking({1}), "ca [0 1] 0");
+    // the clicks are forgotten by that: this is a second a
+    EXPECT_EQ(clicking({1}), "ca [0 1] 1");
     press("Clear");
-    EXPECT_EQ(clearing(), " [] 0");
+    EXPECT_EQ(clearing(), " [] 1");
     type("tone");
-    EXPECT_EQ(clearing(), "ton [2 5 6] 0");
+    EXPECT_EQ(clearing(), "ton [2 5 6] 1");
 }
 
 TEST_F(WordEntry, ClicksStayInTheirSlots) {
@@ -94,10 +99,8 @@ TEST_F(WordEntry, ClicksStayInTheirSlots) {
         click(i % CubeCount);
         replaceAll("");
     }
-    const std::string picked = State.PickedWord;
     EXPECT_EQ(clicking({1}), " [] 1");
     EXPECT_EQ(State.PickedCount, PickedSlots);
-    EXPECT_EQ(State.PickedWord, picked);
     start("QITAKENSHORDGLUB");
     click(0);
     for (int i = 0; i < 2; ++i) {  // more letters are taken back than clicks
@@ -105,6 +108,52 @@ TEST_F(WordEntry, ClicksStayInTheirSlots) {
         press("Clear");
         EXPECT_EQ(State.PickedCount, 0);
     }
+}
+
+TEST_F(WordEntry, WordsAreListedNewestFirstAndUnknownOnesStruckThrough) {
+    enter({"cat"});
+    EXPECT_EQ(text("PlayerWordLabel"), "1 word entered");
+    type("sta");
+    key(Qt::Key_Enter, Qt::KeypadModifier);
+    type("bone");
+    press("Enter");
+    enter({"cat"});  // entered already: silently gone
+    EXPECT_EQ(words(), (Words{"bone", "sta", "cat"}));
+    EXPECT_EQ(words("WordList", true), Words{"sta"});
+    EXPECT_EQ(text("PlayerWordLabel"), "3 words entered");
+    EXPECT_EQ(entry(), " [] 1");
+    enter({"cats", "coat", "con", "bon", "won", "one", "ton", "tone", "ten", "net"});
+    auto& list = *control<QTableWidget>("WordList");
+    list.scrollToBottom();
+    enter({"now"});
+    EXPECT_EQ(list.rowAt(0), 0);
+}
+
+TEST_F(WordEntry, TheLimitsOfTheMomentCount) {
+    cSetMinWordSize(2);
+    cSetMaxWordSize(3);
+    enter({"ca", "cats"});
+    EXPECT_EQ(words(), Words{"ca"});
+    EXPECT_EQ(entry(), " [] 1");
+    clickTiles({0, 1, 2});
+    replaceAll("CAT");  // in upper case it stays only as what was clicked
+    key(Qt::Key_Return);
+    EXPECT_EQ(words(), (Words{"cat", "ca"}));
+}
+
+TEST_F(WordEntry, ReturnSubmitsWhereverTheFocusIs) {
+    for (const auto& [name, word] :
+         {std::pair("WordList", "cat"), {"Clear", "won"}, {"Exit", "ten"}}) {
+        type(word);
+        control(name)->setFocus();
+        key(Qt::Key_Return);
+        EXPECT_EQ(words().front(), word);
+    }
+    type("con");
+    press("Clear");  // buttons and tiles leave the focus where it is
+    click(6);
+    type("e");
+    EXPECT_EQ(typed(), "cone");
 }
 
 }  // namespace

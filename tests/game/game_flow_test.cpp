@@ -1,6 +1,4 @@
 // One game from Start to its end, and the clock.
-#include <QTest>
-
 #include "platform/platform.h"
 #include "support/program_fixture.h"
 
@@ -75,12 +73,6 @@ TEST_F(GameFlow, TheClockCountsOnlyWithItsWindowInFront) {
         tick();
         EXPECT_EQ(times(), "Time Remaining 2:59");
     }
-}
-
-TEST_F(GameFlow, TheRealClockFires) {
-    control<QTimer>("GameClock")->setInterval(1000);
-    start();
-    EXPECT_TRUE(QTest::qWaitFor([&] { return times() == "Time Remaining 2:59"; }, 10000));
 }
 
 }  // namespace

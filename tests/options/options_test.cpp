@@ -16,7 +16,7 @@ class OptionsTest : public ProgramFixture {
         press("Options");
     }
 
-    /// Chooses in the boxes named and presses a button.
+    /// Opens the window, chooses in the boxes named and presses a button.
     void choose(const std::map<std::string, const char*>& choices, const char* button) {
         press("Options");
         for (const auto& [box, entry] : choices) control<QComboBox>(box)->setCurrentText(entry);

@@ -64,16 +64,6 @@ TEST_F(Accessibility, ATileTellsItsLetterItsPlaceAndWhetherItIsLit) {
     EXPECT_EQ(description("ResultCubes7"), "Row 2, column 4");
 }
 
-TEST_F(Accessibility, AWordThatIsStruckThroughSaysWhy) {
-    enter({"sta"});
-    press("End");
-    for (const char* list : {"WordList", "BadWords"}) {
-        const auto& row = *told(control(list)).tableInterface()->cellAt(0, 0);
-        EXPECT_EQ(row.text(QAccessible::Name) + ": " + row.text(QAccessible::Description),
-                  "sta: not in dictionary");
-    }
-}
-
 TEST_F(Accessibility, ToolbarButtonsHaveShortcutsAndArePressedWithoutWaiting) {
     for (auto* button : control("ToolBar")->findChildren<QAbstractButton*>()) {
         EXPECT_FALSE(button->shortcut().isEmpty()) << button->objectName().toStdString();

@@ -35,6 +35,8 @@ TEST_F(Heard, TheBoardThenWhatBecomesOfEachLetterAndWord) {
     EXPECT_EQ(entering("cat"), Words{"right. 1 word entered"});
     EXPECT_EQ(entering("cat"), Words{"already listed"});
     EXPECT_EQ(entering("sta"), Words{"not in dictionary. 2 words entered"});
+    const auto& struck = *control<QTableWidget>("WordList")->item(0, 0);
+    EXPECT_EQ(struck.data(Qt::AccessibleDescriptionRole), "not in dictionary");
     EXPECT_EQ(entering("ca"), Words{"too short"});
     type("x");
     EXPECT_EQ(heard(), Words{"x taken off"});
@@ -70,7 +72,6 @@ TEST_F(Heard, TheSummaryThenAResultsPlacesAndItsCorrection) {
                              "1 word not in dictionary"});
     press("End");
     EXPECT_EQ(control("Results")->focusWidget(), control("ResultsOK"));
-    EXPECT_EQ(description("ResultsOK").substr(0, 11), "Game over. ");
 }
 
 TEST_F(Heard, OptionsAndTheEditorsWords) {
@@ -94,7 +95,6 @@ TEST_F(Heard, OptionsAndTheEditorsWords) {
     Platform::ChooseFileToOpen = [this](const std::string&) { return folder_ / "words"; };
     menu("DictionaryEditor/Merge");
     EXPECT_EQ(heard(), Words{"merged. 11 words"});
-    EXPECT_EQ(control("DictionaryEditor")->focusWidget(), control("DictionaryEditor/NewWord"));
 }
 
 // A reader follows the current cell, so it must not move while words are typed; and

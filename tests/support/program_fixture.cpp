@@ -3,7 +3,6 @@
 #include <QAbstractItemView>
 #include <QClipboard>
 #include <QTest>
-#include <QTimerEvent>
 
 #include "app/main_window_events.h"
 #include "app/shutdown.h"
@@ -11,11 +10,16 @@
 
 namespace {
 
+// Not QTest's own wait: to it a window is active, too, when one that it owns is.
+bool ComesToFront(const QWidget& window) {
+    return QTest::qWaitFor([&] { return QApplication::activeWindow() == &window; }, 2000);
+}
+
 // A desktop brings a window that is clicked to the front; there is none here.
 void Activate(QWidget& window) {
     QCoreApplication::processEvents();  // what the program still does about its windows
     window.activateWindow();
-    if (!QTest::qWaitForWindowActive(&window)) throw std::logic_error("not in front");
+    if (!ComesToFront(window)) throw std::logic_error("not in front");
 }
 
 void ClickOn(const QWidget& widget, const QPoint& place) {
@@ -104,9 +108,7 @@ void ProgramFixture::bringToFront(const std::string& window) {
 }
 
 bool ProgramFixture::comesToFront(const std::string& window) {
-    // Not QTest's own wait: to it a window is active when one that it owns is.
-    const auto inFront = [&] { return QApplication::activeWindow() == control(window); };
-    return QTest::qWaitFor(inFront, 2000);
+    return ComesToFront(*control(window));
 }
 
 void ProgramFixture::closeByTitleBar(const std::string& window) {
@@ -117,8 +119,7 @@ void ProgramFixture::closeByTitleBar(const std::string& window) {
 void ProgramFixture::tick(int times) {
     auto& clock = *control<QTimer>("GameClock");
     for (int i = 0; i < times && clock.isActive(); ++i) {
-        QTimerEvent event(clock.timerId());
-        QCoreApplication::sendEvent(&clock, &event);
+        QMetaObject::invokeMethod(&clock, "timeout");
     }
 }
 
@@ -146,8 +147,7 @@ std::string ProgramFixture::summary() {
 std::string ProgramFixture::letters(const std::string& tiles) {
     std::string all;
     for (int k = 0; k < CubeCount; ++k) {
-        const std::string letter = text(tiles + std::to_string(k), "accessibleName");
-        all += letter.empty() ? '.' : letter[0];
+        all += (text(tiles + std::to_string(k), "accessibleName") + '.')[0];
     }
     return all;
 }

@@ -1,0 +1,116 @@
+// Boxes and file dialogs, which window comes to the front, and how windows stand to each other.
+#include <QLineEdit>
+#include <QTest>
+#include <QWindow>
+
+#include "platform/platform.h"
+#include "platform/window_front.h"
+#include "support/program_fixture.h"
+
+namespace {
+
+class WindowsOfTheDesktop : public PlayedBoard {
+  protected:
+    void expectNameTyped(const std::string& name) {
+        boxes_.expectModal([=](QWidget& dialog) {
+            auto* edit = dialog.findChild<QLineEdit*>();
+            edit->setText(QString::fromStdString(name));
+            QTest::keyClick(edit, Qt::Key_Return);
+        });
+    }
+    static void useWayland() {
+        Platform::OnWayland = [] { return true; };
+    }
+};
+
+TEST_F(WindowsOfTheDesktop, OnlyItsButtonsAnswerAQuestionAndTheFrontComesBack) {
+    for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
+        boxes_.expect("Sure?", answer, [] {
+            QWidget& box = *QApplication::activeModalWidget();
+            const QRect owner = box.parentWidget()->frameGeometry();
+            EXPECT_LT((box.frameGeometry().center() - owner.center()).manhattanLength(), 40);
+            QTest::keyClick(&box, Qt::Key_Escape);
+            EXPECT_FALSE(box.close());
+            EXPECT_TRUE(box.isVisible());
+        });
+        EXPECT_EQ(Platform::AskYesNo("Sure?", "Quorle"), answer == QMessageBox::Yes);
+        EXPECT_TRUE(comesToFront("Main"));
+    }
+}
+
+TEST_F(WindowsOfTheDesktop, ASavedFileGetsASuffixAndIsReplacedOnlyWhenAllowed) {
+    const std::string folder = folder_.path();
+    for (const auto& [typed, saved] : {std::pair("words", "/words.txt"), {"a.list", "/a.list"}}) {
+        expectNameTyped(typed);
+        EXPECT_EQ(Platform::ChooseFileToSave(folder), folder + saved);
+    }
+    folder_.write("words.txt", "cat\n");
+    for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
+        expectNameTyped("words");
+        boxes_.expect("words.txt already exists. Do you want to replace it?", answer);
+        EXPECT_EQ(Platform::ChooseFileToSave(folder).empty(), answer == QMessageBox::No);
+    }
+    expectNameTyped("words.txt");
+    EXPECT_EQ(Platform::ChooseFileToOpen(folder), folder + "/words.txt");
+}
+
+// A box closes: the front is asked for, and the window hides before it comes.
+TEST_F(WindowsOfTheDesktop, AFrontThatWasOnlyAskedForIsGivenBackToo) {
+    press("Options");
+    QWidget elsewhere;
+    elsewhere.show();
+    elsewhere.activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&elsewhere));
+    const QSignalBlocker unanswered(control("OptionsDialog")->windowHandle());
+    WindowFront::GiveBack();
+    elsewhere.hide();
+    WindowFront::Hide(*control("OptionsDialog"));
+    EXPECT_TRUE(comesToFront("Main"));
+}
+
+TEST_F(WindowsOfTheDesktop, OnWaylandOneLeftOpenIsShownAnew) {
+    useWayland();
+    press("Options");
+    int shown = 0;
+    QObject::connect(control("OptionsDialog")->windowHandle(), &QWindow::visibleChanged,
+                     [&shown](bool visible) { shown += visible; });
+    press("Options");
+    EXPECT_TRUE(comesToFront("OptionsDialog"));
+    EXPECT_EQ(shown, 1);
+}
+
+TEST_F(WindowsOfTheDesktop, OnWaylandNoneResistsBeingMaximised) {
+    useWayland();
+    for (const std::string name : {"Options", "Dictionary"}) {
+        press(name);
+        QWidget& window = *QApplication::activeWindow();
+        EXPECT_EQ(window.minimumSize(), window.size()) << name;
+        window.windowHandle()->resize(2000, 1500);
+        QTest::qWait(0);
+        EXPECT_EQ(window.size(), QSize(2000, 1500)) << name;
+    }
+    boxes_.expectPause([] {
+        QWidget& box = *QApplication::activeModalWidget();
+        const int least = box.width();
+        box.showMaximized();
+        QCoreApplication::postEvent(&box, new QEvent(QEvent::LayoutRequest));
+        QTest::qWait(1);
+        EXPECT_GT(box.width(), least);
+    });
+    press("Pause");
+}
+
+TEST_F(WindowsOfTheDesktop, WhereTheyAreTiledTheOthersHaveAnOwner) {
+    press("HelpButton");
+    EXPECT_EQ(control("HelpBrowser")->windowHandle()->transientParent(), nullptr);
+    qputenv("I3SOCK", "socket");
+    press("HelpButton");
+    press("End");
+    qunsetenv("I3SOCK");
+    for (const char* name : {"HelpBrowser", "Results"}) {
+        EXPECT_EQ(control(name)->windowHandle()->transientParent(),
+                  control("Main")->windowHandle());
+    }
+}
+
+}  // namespace
