@@ -53,6 +53,7 @@ TEST_F(Heard, TheSummaryThenAResultsPlacesAndItsCorrection) {
     start();
     enter({"cat", "sta"});
     tick(180);
+    EXPECT_TRUE(comesToFront("Results"));
     EXPECT_EQ(description("ResultsOK"),
               "Time is up. 1 word found out of 7 (14%). Score is 1 out of 7 (14%). 1 word not in "
               "dictionary");
@@ -76,10 +77,11 @@ TEST_F(Heard, TheSummaryThenAResultsPlacesAndItsCorrection) {
 
 TEST_F(Heard, OptionsAndTheEditorsWords) {
     constexpr bool ToolkitTellsBoxes = QT_VERSION >= QT_VERSION_CHECK(6, 8, 0);
-    press("Dictionary");
-    for (const char* box : {"WordSizeCombo", "StartingLetters"}) {
+    for (const auto& [opens, box] :
+         {std::pair("Options", "MinWordSizeCombo"), {"Dictionary", "StartingLetters"}}) {
+        press(opens);
         EXPECT_EQ(heard(), Words{});
-        if (box == std::string("WordSizeCombo")) press("Options");
+        bringToFront(box);
         control(box)->setFocus();
         key(Qt::Key_Down);
         const std::string value = control<QComboBox>(box)->currentText().toStdString();

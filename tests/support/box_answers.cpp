@@ -45,7 +45,8 @@ void BoxAnswers::look() {
     QWidget* window = QApplication::activeModalWidget();
     if (window == nullptr) return;
     timer_.stop();
-    EXPECT_TRUE(QTest::qWaitForWindowActive(window)) << "not in front: " << TextOf(*window);
+    EXPECT_TRUE(QTest::qWaitFor([=] { return window->isActiveWindow(); }))
+        << "not in front: " << TextOf(*window);
     Act act = otherwise_;
     if (!expected_.empty()) {
         act = expected_.front();
