@@ -3,7 +3,6 @@
 // actions.
 #include <QAbstractButton>
 #include <QComboBox>
-#include <QTest>
 #include <algorithm>
 #include <iostream>
 

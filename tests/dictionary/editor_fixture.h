@@ -3,7 +3,6 @@
 #include <quorle/word_engine.h>
 
 #include <QComboBox>
-#include <QTest>
 
 #include "platform/platform.h"
 #include "support/program_fixture.h"

@@ -3,7 +3,6 @@
 #include <QAccessible>
 #include <QLabel>
 #include <QMenuBar>
-#include <QTest>
 #include <set>
 
 #include "support/program_fixture.h"

@@ -3,7 +3,6 @@
 #include <QListWidget>
 #include <QSignalSpy>
 #include <QTableWidget>
-#include <QTest>
 
 #include "platform/platform.h"
 #include "support/program_fixture.h"

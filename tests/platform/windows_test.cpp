@@ -1,6 +1,5 @@
 // Boxes and file dialogs, which window comes to the front, and how windows stand to each other.
 #include <QLineEdit>
-#include <QTest>
 #include <QWindow>
 
 #include "platform/platform.h"

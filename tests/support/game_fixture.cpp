@@ -68,7 +68,6 @@ void GameFixture::makeDictionary(const std::vector<std::string>& words, int maxi
     cSetMaxWordSize(maximum);
     for (const std::string& word : words) EXPECT_EQ(cDictionaryAdd(word.c_str()), 1) << word;
     EXPECT_EQ(cWriteBinaryDictionary((folder_ / "program/Dictionary.dat").c_str()), 1);
-    resetProcess();
 }
 
 int GameFixture::wordsInFile() const {

@@ -18,7 +18,7 @@ class GameFixture : public testing::Test {
     /// State and engine as in a new process.
     static void resetProcess();
 
-    /// Writes the program folder's dictionary, and leaves the engine as at start.
+    /// Writes the program folder's dictionary. The engine then holds it, too.
     void makeDictionary(const std::vector<std::string>& words, int maximum = 16);
 
     /// How many words it holds now; the engine then holds them.

@@ -2,33 +2,28 @@
 
 #include <QAbstractItemView>
 #include <QClipboard>
-#include <QTest>
 
 #include "app/main_window_events.h"
 #include "app/shutdown.h"
 #include "platform/platform.h"
 
-namespace {
-
 // Not QTest's own wait: to it a window is active, too, when one that it owns is.
-bool ComesToFront(const QWidget& window) {
+bool ProgramFixture::comesToFront(const QWidget& window) {
     return QTest::qWaitFor([&] { return QApplication::activeWindow() == &window; }, 2000);
 }
 
 // A desktop brings a window that is clicked to the front; there is none here.
-void Activate(QWidget& window) {
+void ProgramFixture::activate(QWidget& window) {
     QCoreApplication::processEvents();  // what the program still does about its windows
     window.activateWindow();
-    if (!ComesToFront(window)) throw std::logic_error("not in front");
+    if (!comesToFront(window)) throw std::logic_error("not in front");
 }
 
-void ClickOn(const QWidget& widget, const QPoint& place) {
+void ProgramFixture::clickOn(const QWidget& widget, const QPoint& place) {
     QWidget* window = widget.window();
-    if (QApplication::activeModalWidget() == nullptr) Activate(*window);
+    if (QApplication::activeModalWidget() == nullptr) activate(*window);
     QTest::mouseClick(window->windowHandle(), Qt::LeftButton, {}, widget.mapTo(window, place));
 }
-
-}  // namespace
 
 void ProgramFixture::endProgram() {
     Common::DestroyWindows();
@@ -52,19 +47,11 @@ void ProgramFixture::start(const std::string& board) {
     press("Start");
 }
 
-void ProgramFixture::press(const std::string& button) {
-    ClickOn(*control(button), control(button)->rect().center());
-}
-
 void ProgramFixture::type(const std::string& text) {
     for (const char32_t letter : QString::fromStdString(text).toStdU32String()) {
         QTest::sendKeyEvent(QTest::Click, QApplication::focusWindow(), Qt::Key_unknown,
                             QString::fromUcs4(&letter, 1), Qt::NoModifier);
     }
-}
-
-void ProgramFixture::key(Qt::Key key, Qt::KeyboardModifiers modifiers) {
-    QTest::keyClick(QApplication::focusWindow(), key, modifiers);
 }
 
 void ProgramFixture::enter(const Words& entered) {
@@ -84,10 +71,6 @@ void ProgramFixture::paste(const std::string& text) {
     key(Qt::Key_V, Qt::ControlModifier);
 }
 
-void ProgramFixture::clickTiles(const Tiles& tiles) {
-    for (const int tile : tiles) click(tile);
-}
-
 void ProgramFixture::doubleClick(int tile) {
     QWidget* clicked = control("Cube" + std::to_string(tile));
     const QPoint place = clicked->mapTo(clicked->window(), clicked->rect().center());
@@ -100,15 +83,7 @@ void ProgramFixture::select(const std::string& list, const std::string& word) {
                                             QString::fromStdString(word), 1, Qt::MatchExactly);
     if (found.isEmpty()) throw std::logic_error(list + " has no " + word);
     shown.scrollTo(found.first());
-    ClickOn(*shown.viewport(), shown.visualRect(found.first()).center());
-}
-
-void ProgramFixture::bringToFront(const std::string& window) {
-    Activate(*control(window)->window());
-}
-
-bool ProgramFixture::comesToFront(const std::string& window) {
-    return ComesToFront(*control(window));
+    clickOn(*shown.viewport(), shown.visualRect(found.first()).center());
 }
 
 void ProgramFixture::closeByTitleBar(const std::string& window) {
@@ -121,11 +96,6 @@ void ProgramFixture::tick(int times) {
     for (int i = 0; i < times && clock.isActive(); ++i) {
         QMetaObject::invokeMethod(&clock, "timeout");
     }
-}
-
-bool ProgramFixture::isShown(const std::string& window) {
-    const auto* found = find<QWidget>(window);
-    return found != nullptr && found->isVisible();
 }
 
 std::string ProgramFixture::text(const std::string& name, const char* property) {

@@ -4,6 +4,7 @@
 // main window first; "Results/ResultsOK" is the one in that window.
 #include <QAction>
 #include <QApplication>
+#include <QTest>
 #include <stdexcept>
 #include <string>
 #include <vector>
@@ -27,24 +28,30 @@ class ProgramFixture : public GameFixture {
 
     // What the player does.
     void start(const std::string& board = "CATSBONEWILDHEFY");  ///< presses Start
-    void press(const std::string& button);                      ///< by mouse
-    void type(const std::string& text);                         ///< key by key
-    void key(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
+    void press(const std::string& name) { clickOn(*control(name), control(name)->rect().center()); }
+    void type(const std::string& text);  ///< key by key
+    void key(Qt::Key key, Qt::KeyboardModifiers with = {}) {
+        QTest::keyClick(QApplication::focusWindow(), key, with);
+    }
     void enter(const Words& words);  ///< types each, and Return
     void paste(const std::string& text);
     void replaceAll(const std::string& text);  ///< selects all, then pastes or deletes
     void click(int tile) { press("Cube" + std::to_string(tile)); }
-    void clickTiles(const Tiles& tiles);
+    void clickTiles(const Tiles& tiles) {
+        for (const int tile : tiles) click(tile);
+    }
     void doubleClick(int tile);
     void select(const std::string& list, const std::string& word);  ///< by mouse
     void menu(const std::string& command) { control<QAction>(command)->trigger(); }
-    void bringToFront(const std::string& window);
+    void bringToFront(const std::string& name) { activate(*control(name)->window()); }
     void closeByTitleBar(const std::string& window);
     void tick(int times = 1);  ///< the clock fires, if it runs
 
     // What the player sees.
-    bool comesToFront(const std::string& window);  ///< now or soon
-    bool isShown(const std::string& window);
+    bool comesToFront(const std::string& name) { return comesToFront(*control(name)); }  ///< soon
+    bool isShown(const std::string& name) {
+        return find(name) != nullptr && find(name)->isVisible();
+    }
     std::string text(const std::string& control, const char* property = "text");
     std::string description(const std::string& of) { return text(of, "accessibleDescription"); }
     std::string typed() { return text("NewWord"); }
@@ -68,7 +75,11 @@ class ProgramFixture : public GameFixture {
     BoxAnswers boxes_;
 
   private:
-    template <class Control>
+    static bool comesToFront(const QWidget& window);
+    static void activate(QWidget& window);
+    static void clickOn(const QWidget& widget, const QPoint& place);
+
+    template <class Control = QWidget>
     static Control* find(const std::string& name) {
         const QString path = QString::fromStdString(name);
         const QString window = path.section('/', 0, -2);
