@@ -9,7 +9,7 @@ class GameFlow : public PlayedBoard {
     std::string times() { return text("TimeRemLabel") + " " + text("TimeLeft"); }
 };
 
-TEST_F(GameFlow, AWholeGameRunsOut) {
+TEST_F(GameFlow, AWholeGameRunsOutButNotInAPause) {
     State.TimeLimit = 15;
     start();
     EXPECT_EQ(times(), "Time Remaining 0:15");
@@ -17,6 +17,12 @@ TEST_F(GameFlow, AWholeGameRunsOut) {
     enter({"cat"});
     type("bo");
     tick(14);
+    boxes_.expectPause([this] {
+        EXPECT_FALSE(isShown("CubeFrame"));
+        tick(3);
+    });
+    press("Pause");
+    EXPECT_TRUE(isShown("CubeFrame"));
     EXPECT_EQ(times(), "Time Remaining 0:01");
     EXPECT_FALSE(isShown("Results"));
     tick(2);
@@ -35,22 +41,6 @@ TEST_F(GameFlow, StartDropsARunningGame) {
     EXPECT_EQ(times() + text("PlayerWordLabel") + entry(), "Time Remaining 3:00 [] 0");
     EXPECT_EQ(State.PickedWord + std::to_string(State.PickedCount), "0");
     EXPECT_EQ(text("DefinedWordCount"), "Quorle found 1 words");
-}
-
-TEST_F(GameFlow, APauseHidesTheBoardAndCostsNoTime) {
-    start();
-    tick();
-    type("ca");
-    boxes_.expectPause([this] {
-        EXPECT_FALSE(isShown("CubeFrame"));
-        tick(3);
-        click(2);  // the box is modal
-    });
-    press("Pause");
-    EXPECT_TRUE(isShown("CubeFrame"));
-    EXPECT_EQ(times(), "Time Remaining 2:59");
-    EXPECT_TRUE(comesToFront("Main"));
-    EXPECT_EQ(typing("t"), "cat [0 1 2] 0");
 }
 
 TEST_F(GameFlow, TheClockCountsOnlyWithItsWindowInFront) {

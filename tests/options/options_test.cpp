@@ -57,7 +57,6 @@ TEST_F(OptionsTest, AnotherMinimumStopsTheGameOnlyWhenThePlayerAgrees) {
         tick();
         EXPECT_EQ(isShown("Results"), agrees);
     }
-    choose({{"MinWordSizeCombo", "5 letters"}}, "OKButton");  // no game: nothing is asked
 }
 
 TEST_F(OptionsTest, ASmallerMaximumRemovesWordsOnlyWhenThePlayerAgrees) {

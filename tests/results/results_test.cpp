@@ -42,7 +42,7 @@ TEST_F(GameResults, SortThePlayersWordsByTheDictionaryOfTheEnd) {
     press("End");
     EXPECT_EQ(lists(), "cat con | sta won | bone cat cats coat ten tone won | ");
     EXPECT_EQ(summary(),
-              "2 words found out of 7 (28%); Score is 2 out of 7 (28%); 2 words not in dictionary");
+              "2 words found out of 7 (28%). Score is 2 out of 7 (28%). 2 words not in dictionary");
     EXPECT_TRUE(comesToFront("Results"));
 }
 
@@ -82,7 +82,7 @@ TEST_F(GameResults, WordsGoIntoTheDictionaryAndOutOfIt) {
     EXPECT_EQ(litResults(), (Tiles{4, 5, 6, 7, 11}));
     press("AddToDict");
     EXPECT_EQ(summary(),
-              "4 words found out of 10 (40%); Score is 5 out of 11 (45%); "
+              "4 words found out of 10 (40%). Score is 5 out of 11 (45%). "
               "0 words not in dictionary");
     take("DictWords", "cat");
     take("DictWords", "won");
@@ -112,7 +112,7 @@ TEST_F(GameResults, CloseOnlyAfterTwoSeconds) {
     control("DictWords")->setFocus();
     key(Qt::Key_Return);
     EXPECT_FALSE(isShown("Results"));
-    EXPECT_EQ(lists() + summary(), "| | | ; ; ");
+    EXPECT_EQ(lists() + summary(), "| | | . . ");
     EXPECT_TRUE(comesToFront("Main"));
 }
 

@@ -111,7 +111,7 @@ std::string ProgramFixture::entry() {
 }
 
 std::string ProgramFixture::summary() {
-    return text("WordsLabel") + "; " + text("ScoreLabel") + "; " + text("BadWordsLabel");
+    return text("WordsLabel") + ". " + text("ScoreLabel") + ". " + text("BadWordsLabel");
 }
 
 std::string ProgramFixture::letters(const std::string& tiles) {
