@@ -51,18 +51,16 @@ TEST_F(GameFlow, TheClockCountsOnlyWithItsWindowInFront) {
     boxes_.expect("Wait.", QMessageBox::Ok, [this] { tick(2); });
     Platform::ShowMessage("Wait.", "Quorle");  // stands for its window once, when that is recorded
     EXPECT_EQ(times(), "Time Remaining 2:58");
-    for (const bool closed : {true, false}) {
-        press("Main/End");
-        start();
-        bringToFront("Results");
-        tick(3);
-        EXPECT_EQ(times(), "Time Remaining 3:00");
-        seconds_ += 3;
-        closed ? closeByTitleBar("Results") : press("Results/ResultsOK");
-        EXPECT_TRUE(comesToFront("Main"));
-        tick();
-        EXPECT_EQ(times(), "Time Remaining 2:59");
-    }
+    press("Main/End");
+    start();
+    bringToFront("Results");
+    tick(3);
+    EXPECT_EQ(times(), "Time Remaining 3:00");
+    seconds_ += 3;
+    press("Results/ResultsOK");
+    EXPECT_TRUE(comesToFront("Main"));
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 2:59");
 }
 
 }  // namespace

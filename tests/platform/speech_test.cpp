@@ -4,7 +4,6 @@
 #include <QSignalSpy>
 #include <QTableWidget>
 
-#include "platform/platform.h"
 #include "support/program_fixture.h"
 
 namespace {
@@ -82,10 +81,6 @@ TEST_F(Heard, OptionsAndTheEditorsWords) {
     select("DictionaryEditor/WordList", "cat");
     press("Remove");
     EXPECT_EQ(heard(), Words{"cat removed. 9 words"});
-    folder_.write("words", "ant\nowl\n");
-    Platform::ChooseFileToOpen = [this](const std::string&) { return folder_ / "words"; };
-    menu("DictionaryEditor/Merge");
-    EXPECT_EQ(heard(), Words{"merged. 11 words"});
 }
 
 // A reader follows the current cell, so it must not move while words are typed; and

@@ -17,9 +17,6 @@ class WindowsOfTheDesktop : public PlayedBoard {
             QTest::keyClick(edit, Qt::Key_Return);
         });
     }
-    static void useWayland() {
-        Platform::OnWayland = [] { return true; };
-    }
 };
 
 TEST_F(WindowsOfTheDesktop, OnlyItsButtonsAnswerAQuestionAndTheFrontComesBack) {
@@ -66,7 +63,7 @@ TEST_F(WindowsOfTheDesktop, AFrontThatWasOnlyAskedForIsGivenBackToo) {
 }
 
 TEST_F(WindowsOfTheDesktop, OnWaylandOneLeftOpenIsShownAnew) {
-    useWayland();
+    Platform::OnWayland = [] { return true; };
     press("Options");
     int shown = 0;
     QObject::connect(control("OptionsDialog")->windowHandle(), &QWindow::visibleChanged,
@@ -77,7 +74,7 @@ TEST_F(WindowsOfTheDesktop, OnWaylandOneLeftOpenIsShownAnew) {
 }
 
 TEST_F(WindowsOfTheDesktop, OnWaylandNoneResistsBeingMaximised) {
-    useWayland();
+    Platform::OnWayland = [] { return true; };
     for (const std::string name : {"Options", "Dictionary"}) {
         press(name);
         QWidget& window = *QApplication::activeWindow();
