@@ -1,6 +1,4 @@
 // What the program asks when it starts and when it ends.
-#include <quorle/word_engine.h>
-
 #include <unistd.h>
 
 #include <QSessionManager>

@@ -1,6 +1,4 @@
-#include <QWindow>
-
-#include "dictionary/editor_fixture.h"
+#include "support/program_fixture.h"
 
 namespace {
 

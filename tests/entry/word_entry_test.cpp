@@ -1,9 +1,4 @@
 // Building a word by keys and clicks, and submitting it.
-#include <quorle/word_engine.h>
-
-#include <QMouseEvent>
-#include <QTableWidget>
-
 #include "support/program_fixture.h"
 
 namespace {

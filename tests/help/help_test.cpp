@@ -1,6 +1,3 @@
-#include <QImage>
-#include <QTextBrowser>
-
 #include "support/program_fixture.h"
 
 namespace {

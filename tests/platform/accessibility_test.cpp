@@ -1,8 +1,4 @@
 // What a screen reader finds in the windows.
-#include <QAbstractButton>
-#include <QAccessible>
-#include <QLabel>
-#include <QMenuBar>
 #include <set>
 
 #include "support/program_fixture.h"

@@ -1,8 +1,5 @@
 // What a screen reader is told while a game is played without looking.
-#include <QComboBox>
-#include <QListWidget>
 #include <QSignalSpy>
-#include <QTableWidget>
 
 #include "support/program_fixture.h"
 

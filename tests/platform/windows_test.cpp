@@ -1,8 +1,4 @@
 // Boxes and file dialogs, which window comes to the front, and how windows stand to each other.
-#include <QLineEdit>
-#include <QWindow>
-
-#include "platform/platform.h"
 #include "platform/window_front.h"
 #include "support/program_fixture.h"
 

@@ -2,9 +2,8 @@
 
 #include <gtest/gtest.h>
 
-#include <QAbstractButton>
-#include <QApplication>
 #include <QTest>
+#include <QtWidgets>
 
 namespace {
 

@@ -1,9 +1,6 @@
 #include "support/game_fixture.h"
 
-#include <quorle/word_engine.h>
-
 #include "board/dice.h"
-#include "platform/platform.h"
 
 namespace {
 

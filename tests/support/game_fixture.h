@@ -2,6 +2,7 @@
 // A program of its own for each test: fresh state, folders, settings and engine,
 // and a desktop that does what the test says. Names no Qt.
 #include <gtest/gtest.h>
+#include <quorle/word_engine.h>
 
 #include <deque>
 #include <random>
@@ -9,6 +10,7 @@
 #include <vector>
 
 #include "engine/temp_folder.h"
+#include "platform/platform.h"
 #include "state/game_state.h"
 
 class GameFixture : public testing::Test {

@@ -1,11 +1,7 @@
 #include "support/program_fixture.h"
 
-#include <QAbstractItemView>
-#include <QClipboard>
-
 #include "app/main_window_events.h"
 #include "app/shutdown.h"
-#include "platform/platform.h"
 
 // Not QTest's own wait: to it a window is active, too, when one that it owns is.
 bool ProgramFixture::comesToFront(const QWidget& window) {
@@ -139,4 +135,16 @@ Tiles ProgramFixture::litTiles(const std::string& tiles) {
         if (control(tiles + std::to_string(k))->property("selected").toBool()) found.push_back(k);
     }
     return found;
+}
+
+// No test may touch the screen or the home of whoever runs it.
+int main(int argc, char** argv) {
+    testing::InitGoogleTest(&argc, argv);
+    const TempFolder home;
+    UseHome(home.path());
+    setenv("QT_QPA_PLATFORM", "offscreen", 1);
+    unsetenv("QT_SCALE_FACTOR");
+    QApplication application(argc, argv);
+    QApplication::setQuitOnLastWindowClosed(false);
+    return RUN_ALL_TESTS();
 }

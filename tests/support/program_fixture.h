@@ -2,12 +2,9 @@
 // The real program, offscreen, used as a player uses it: keys go where the focus
 // is, mouse clicks to whatever is on top. Controls go by their names, those of the
 // main window first; "Results/ResultsOK" is the one in that window.
-#include <QAction>
-#include <QApplication>
 #include <QTest>
+#include <QtWidgets>
 #include <stdexcept>
-#include <string>
-#include <vector>
 
 #include "main_window/main_window.h"
 #include "state/windows.h"
@@ -107,4 +104,26 @@ class PlayedBoard : public ProgramFixture {
 class RunningGame : public PlayedBoard {
   protected:
     RunningGame() { start(); }
+};
+
+/// The dictionary editor open on another.
+class OpenEditor : public ProgramFixture {
+  protected:
+    OpenEditor() {
+        makeDictionary({"bone", "cab", "cat", "zoo"});
+        launch();
+        press("Dictionary");
+    }
+    QComboBox& prefixes() { return *control<QComboBox>("StartingLetters"); }
+
+    /// The prefixes, the selected one and its words, and the count.
+    std::string shown() {
+        std::string all;
+        for (int i = 0; i < prefixes().count(); ++i) {
+            all += prefixes().itemText(i).toStdString() + " ";
+        }
+        all += "| " + prefixes().currentText().toStdString() + ":";
+        for (const auto& word : words("DictionaryEditor/WordList")) all += " " + word;
+        return all + " | " + text("WordCount");
+    }
 };
