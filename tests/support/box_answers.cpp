@@ -1,33 +1,21 @@
 #include "support/box_answers.h"
 
-#include <gtest/gtest.h>
-
 #include <QTest>
 #include <QtWidgets>
 
-namespace {
-
-std::string TextOf(const QWidget& window) {
-    return window.property("text").toString().toStdString();
-}
-
-}  // namespace
-
 BoxAnswers::BoxAnswers() {
-    otherwise_ = [](QWidget& window) { ADD_FAILURE() << "unexpected: " << TextOf(window); };
+    otherwise_ = [](QWidget& window) {
+        ADD_FAILURE() << "unexpected: " << window.property("text").toString().toStdString();
+    };
     QObject::connect(&timer_, &QTimer::timeout, &timer_, [this] { look(); });
     timer_.start(2);
-}
-
-BoxAnswers::~BoxAnswers() {
-    EXPECT_TRUE(expected_.empty()) << expected_.size() << " expected windows have not come";
 }
 
 void BoxAnswers::expect(const std::string& text, QMessageBox::StandardButton answer,
                         const std::function<void()>& whileUp, const std::string& title) {
     expectModal([=](QWidget& window) {
         auto* box = qobject_cast<QMessageBox*>(&window);
-        ASSERT_NE(box, nullptr) << "no message box, but " << TextOf(window);
+        ASSERT_NE(box, nullptr);
         EXPECT_EQ(box->windowTitle().toStdString(), title);
         EXPECT_EQ(box->text().toStdString(), text);
         EXPECT_EQ(box->buttons().size(), answer == QMessageBox::Ok ? 1 : 2);
@@ -43,7 +31,7 @@ void BoxAnswers::look() {
     if (window == nullptr) return;
     timer_.stop();
     EXPECT_TRUE(QTest::qWaitFor([=] { return window->isActiveWindow(); }))
-        << "not in front: " << TextOf(*window);
+        << "not in front: " << window->windowTitle().toStdString();
     Act act = otherwise_;
     if (!expected_.empty()) {
         act = expected_.front();

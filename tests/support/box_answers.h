@@ -1,6 +1,8 @@
 #pragma once
 // Answers the program's modal windows, each when it is up and only if it is the
 // one expected.
+#include <gtest/gtest.h>
+
 #include <QMessageBox>
 #include <QTimer>
 #include <deque>
@@ -12,7 +14,7 @@ class BoxAnswers {
     using Act = std::function<void(QWidget&)>;
 
     BoxAnswers();
-    ~BoxAnswers();  ///< fails the test when an expected window has not come
+    ~BoxAnswers() { EXPECT_TRUE(expected_.empty()) << "an expected window has not come"; }
 
     /// The next modal window is a message box with this text, and an OK or a Yes and
     /// a No; `whileUp` runs in front of it, then `answer` is pressed.

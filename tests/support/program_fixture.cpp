@@ -94,12 +94,6 @@ void ProgramFixture::tick(int times) {
     }
 }
 
-std::string ProgramFixture::text(const std::string& name, const char* property) {
-    const QVariant text = control(name)->property(property);
-    if (!text.isValid()) throw std::logic_error("no text on " + name);
-    return text.toString().toStdString();
-}
-
 std::string ProgramFixture::entry() {
     std::string lit;
     for (const int tile : litTiles()) lit += (lit.empty() ? "" : " ") + std::to_string(tile);

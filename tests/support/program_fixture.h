@@ -49,7 +49,9 @@ class ProgramFixture : public GameFixture {
     bool isShown(const std::string& name) {
         return find(name) != nullptr && find(name)->isVisible();
     }
-    std::string text(const std::string& control, const char* property = "text");
+    std::string text(const std::string& name, const char* property = "text") {
+        return control(name)->property(property).toString().toStdString();
+    }
     std::string description(const std::string& of) { return text(of, "accessibleDescription"); }
     std::string typed() { return text("NewWord"); }
     Tiles litTiles(const std::string& tiles = "Cube");
