@@ -6,8 +6,8 @@ namespace {
 class WordEntry : public RunningGame {
   protected:
     // Straight to a tile, for sequences that no single click makes.
-    void mouse(QEvent::Type type, int tile, QPointF place) {
-        QMouseEvent event(type, place, place, Qt::LeftButton, Qt::LeftButton, {});
+    void mouse(QEvent::Type type, int tile, QPointF place, Qt::MouseButton by = Qt::LeftButton) {
+        QMouseEvent event(type, place, place, by, by, {});
         QCoreApplication::sendEvent(control("Cube" + std::to_string(tile)), &event);
     }
 };
@@ -44,6 +44,8 @@ TEST_F(WordEntry, QuIsOneCube) {
 TEST_F(WordEntry, ClicksLightWhatWasClickedAndTheLastOneSubmits) {
     start("CATSCONEWILDHEFY");
     EXPECT_EQ(clicking({4, 1}), "ca [1 4] 0");  // though the trace would take the other c
+    mouse(QEvent::MouseButtonPress, 2, {40, 40}, Qt::RightButton);
+    mouse(QEvent::MouseButtonRelease, 2, {40, 40}, Qt::RightButton);
     EXPECT_EQ(clicking({9}), "ca [1 4] 1");
     clickTiles({2, 2});
     EXPECT_EQ(words(), Words{"cat"});
@@ -67,10 +69,10 @@ TEST_F(WordEntry, DoubleClickAppendsAndSubmitsOnce) {
     EXPECT_EQ(words(), (Words{"coat", "cat"}));
     EXPECT_EQ(entry(), " [] 1");
     // Two tiles clicked in a hurry near their border are two clicks.
-    click(5);
+    clickTiles({4, 5});
     mouse(QEvent::MouseButtonDblClick, 6, {1, 40});
     mouse(QEvent::MouseButtonRelease, 6, {1, 40});
-    EXPECT_EQ(entry(), "on [5 6] 1");
+    EXPECT_EQ(entry(), "bon [4 5 6] 1");
 }
 
 TEST_F(WordEntry, ClearTakesBackTheLastClickOrLetter) {

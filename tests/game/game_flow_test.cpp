@@ -13,20 +13,19 @@ TEST_F(GameFlow, AWholeGameRunsOutButNotInAPause) {
     start("QITAKENSHORDGLUB");
     enter({"ten"});
     clickTiles({0, 1});
-    tick(5);
     start();  // drops that game
     EXPECT_EQ(times() + text("PlayerWordLabel") + entry(), "Time Remaining 0:15 [] 0");
     EXPECT_EQ(State.PickedWord, "");
     EXPECT_EQ(text("DefinedWordCount"), "Quorle found 7 words");
-    enter({"cat"});
-    type("bo");
-    tick(14);
     boxes_.expectPause([this] {
         EXPECT_FALSE(isShown("CubeFrame"));
         tick(3);
     });
     press("Pause");
     EXPECT_TRUE(isShown("CubeFrame"));
+    enter({"cat"});
+    type("bo");
+    tick(14);
     EXPECT_EQ(times(), "Time Remaining 0:01");
     EXPECT_FALSE(isShown("Results"));
     tick(2);
