@@ -28,8 +28,8 @@ void BoxAnswers::expect(const std::string& text, QMessageBox::StandardButton ans
 // and no title bar closes.
 void BoxAnswers::look() {
     QWidget* window = QApplication::activeModalWidget();
-    if (window == nullptr) return;
-    timer_.stop();
+    if (window == nullptr || window == inHand_) return;
+    QWidget* below = std::exchange(inHand_, window);
     EXPECT_TRUE(QTest::qWaitFor([=] { return window->isActiveWindow(); }))
         << "not in front: " << window->windowTitle().toStdString();
     Act act = otherwise_;
@@ -41,5 +41,5 @@ void BoxAnswers::look() {
     if (QApplication::activeModalWidget() == window) {
         dynamic_cast<QDialog&>(*window).done(QDialog::Rejected);
     }
-    timer_.start();
+    inHand_ = below;
 }

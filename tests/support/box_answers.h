@@ -41,4 +41,5 @@ class BoxAnswers {
     QTimer timer_;
     std::deque<Act> expected_;
     Act otherwise_;
+    QWidget* inHand_ = nullptr;
 };
