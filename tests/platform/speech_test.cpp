@@ -96,12 +96,13 @@ TEST_F(Heard, NoRowWhileTypingAndTheOnlyOneOfAListWhenReached) {
     EXPECT_TRUE(words.selectedItems().isEmpty());
     QSignalSpy reached(&words, &QListWidget::currentRowChanged);
     key(Qt::Key_Down);
+    ASSERT_FALSE(reached.isEmpty());
     EXPECT_EQ(reached.last().first(), 0);
     EXPECT_EQ(litResults(), (Tiles{0, 1, 2}));
     control("ResultsOK")->setFocus();
     reached.clear();
     words.setFocus();
-    EXPECT_TRUE(QTest::qWaitFor([&] { return reached.count() == 2; }));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return reached.count() == 2; }));
     EXPECT_EQ(reached.last().first(), 0);
 }
 

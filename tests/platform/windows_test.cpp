@@ -81,6 +81,7 @@ TEST_F(WindowsOfTheDesktop, OnWaylandNoneResistsBeingMaximised) {
         QWidget& box = *QApplication::activeModalWidget();
         QTest::qWait(1);
         const QSize least = box.size();
+        EXPECT_GT(box.maximumWidth(), least.width());
         box.showMaximized();
         QTest::qWait(1);
         QCoreApplication::postEvent(&box, new QEvent(QEvent::LayoutRequest));

@@ -20,6 +20,7 @@ void BoxAnswers::expect(const std::string& text, QMessageBox::StandardButton ans
         EXPECT_EQ(box->text().toStdString(), text);
         EXPECT_EQ(box->buttons().size(), answer == QMessageBox::Ok ? 1 : 2);
         if (whileUp) whileUp();
+        ASSERT_NE(box->button(answer), nullptr);
         QTest::mouseClick(box->button(answer), Qt::LeftButton);
     });
 }
