@@ -1,36 +1,25 @@
-#include <QAbstractItemView>
-
-#include "dictionary/editor_fixture.h"
-#include "platform/platform.h"
+#include "support/program_fixture.h"
 
 namespace {
 
 using Editor = OpenEditor;
 
-TEST_F(Editor, AddsTypedWordsOneAfterAnother) {
+TEST_F(Editor, AddsTypedWordsOneAfterAnotherButNoneThatIsNoWord) {
     prefixes().setCurrentText("CA");
     enter({"Apt", "CAPE", "sixteenlettersab"});
-    EXPECT_EQ(text("DictionaryEditor/NewWord"), "");
     EXPECT_EQ(shown(), "AP BO CA SI ZO | CA: cab cape cat | 7 words");
     EXPECT_TRUE(State.DictionaryChanged);
+    for (const std::string word : {"at", "seventeenlettersx", "don't", "caf\u00e9"}) {
+        const bool fits = word.size() >= 3 && word.size() <= 16;
+        boxes_.expect(fits ? "Word has a non-alphabetic character, no added."
+                           : "Words must be 3 to 16 letters long.");
+        enter({word});
+        EXPECT_EQ(text("DictionaryEditor/NewWord"), "");
+    }
     type("cow");
     select("DictionaryEditor/WordList", "cat");
     key(Qt::Key_Enter, Qt::KeypadModifier);
     EXPECT_EQ(text("WordCount"), "8 words");
-}
-
-TEST_F(Editor, RefusesWhatIsNoWordOfThreeToSixteenLetters) {
-    const std::string length = "Words must be 3 to 16 letters long.";
-    const std::string letters = "Word has a non-alphabetic character, no added.";
-    for (const auto& [word, message] : {std::pair("at", length),
-                                        {"seventeenlettersx", length},
-                                        {"don't", letters},
-                                        {"caf\u00e9", letters}}) {
-        boxes_.expectMessage(message);
-        enter({word});
-        EXPECT_EQ(text("DictionaryEditor/NewWord"), "");
-    }
-    EXPECT_EQ(cNumberOfWords(), 4);
 }
 
 TEST_F(Editor, RemovesTheSelectedWordAndKeepsThePrefixWhileItLasts) {
@@ -40,13 +29,10 @@ TEST_F(Editor, RemovesTheSelectedWordAndKeepsThePrefixWhileItLasts) {
     EXPECT_EQ(shown(), "BO CA ZO | CA: cab | 3 words");
     EXPECT_TRUE(State.DictionaryChanged);
     EXPECT_TRUE(control("DictionaryEditor/WordList")->hasFocus());
-    boxes_.expectMessage("You must select a word to remove.", [] { cDictionaryAdd("cane"); });
+    boxes_.expect("You must select a word to remove.");
     press("Remove");
-    EXPECT_EQ(shown(), "BO CA ZO | CA: cab cane | 4 words");
-    for (const char* word : {"cane", "cab"}) {
-        select("DictionaryEditor/WordList", word);
-        press("Remove");
-    }
+    select("DictionaryEditor/WordList", "cab");
+    press("Remove");
     EXPECT_EQ(shown(), "BO ZO | BO: bone | 2 words");
 }
 
@@ -70,26 +56,19 @@ TEST_F(Editor, ChoosingAPrefixListsItsWordsAlsoTheSameAgain) {
 TEST_F(Editor, ClearsAfterAQuestionAndOffersNoSaving) {
     for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
         EXPECT_EQ(cNumberOfWords(), 4);
-        boxes_.expectQuestion("Clear the dictionary?", answer);
+        boxes_.expect("Clear the dictionary?", answer);
         menu("DictionaryEditor/Clear");
     }
     EXPECT_EQ(shown(), "| : | 0 words");
     press("Main/Exit");
     EXPECT_FALSE(isShown("DictionaryEditor"));
-    EXPECT_EQ(wordsOnDisk(), 4);
+    EXPECT_EQ(wordsInFile(), 4);
 }
 
 TEST_F(Editor, SavesEveryWordAsText) {
-    std::string path;
-    Platform::ChooseFileToSave = [&](const std::string& folder) {
-        EXPECT_EQ(folder, folder_ / "program");
-        return path;
-    };
+    Platform::ChooseFileToSave = [](const std::string& folder) { return folder + "/words.txt"; };
     menu("DictionaryEditor/SaveAs");
-    path = folder_ / "words.txt";
-    menu("DictionaryEditor/SaveAs");
-    EXPECT_EQ(folder_.read("words.txt"), "bone\ncab\ncat\nzoo\n");
-    EXPECT_FALSE(State.DictionaryChanged);
+    EXPECT_EQ(folder_.read("program/words.txt"), "bone\ncab\ncat\nzoo\n");
     key(Qt::Key_Escape);
     EXPECT_FALSE(isShown("DictionaryEditor"));
     EXPECT_TRUE(comesToFront("Main"));

@@ -1,19 +1,13 @@
-// Building a word by keys and clicks.
-#include <QCoreApplication>
-#include <QMouseEvent>
-
+// Building a word by keys and clicks, and submitting it.
 #include "support/program_fixture.h"
 
 namespace {
 
-class WordEntry : public PlayedBoard {
+class WordEntry : public RunningGame {
   protected:
-    WordEntry() { start("CATSBONEWILDHEFY"); }
-
     // Straight to a tile, for sequences that no single click makes.
-    void mouse(QEvent::Type type, int tile, const QPointF& place) {
-        const auto held = type == QEvent::MouseButtonRelease ? Qt::NoButton : Qt::LeftButton;
-        QMouseEvent event(type, place, place, Qt::LeftButton, held, Qt::NoModifier);
+    void mouse(QEvent::Type type, int tile, QPointF place, Qt::MouseButton by = Qt::LeftButton) {
+        QMouseEvent event(type, place, place, by, by, {});
         QCoreApplication::sendEvent(control("Cube" + std::to_string(tile)), &event);
     }
 };
@@ -34,7 +28,7 @@ TEST_F(WordEntry, TypingLightsTheChainAndTakesTheRestOff) {
 
 TEST_F(WordEntry, QuIsOneCube) {
     start("QITAKENSHORDGLUB");
-    EXPECT_EQ(letters(), "QuITAKENSHORDGLUB");
+    EXPECT_EQ(control("Cube0")->accessibleName(), "Qu");
     EXPECT_EQ(typing("q"), "q [0] 0");
     EXPECT_EQ(typing("uit"), "quit [0 1 2] 0");
     key(Qt::Key_Home);
@@ -49,11 +43,10 @@ TEST_F(WordEntry, QuIsOneCube) {
 
 TEST_F(WordEntry, ClicksLightWhatWasClickedAndTheLastOneSubmits) {
     start("CATSCONEWILDHEFY");
-    clickTiles({4, 1});
-    EXPECT_EQ(entry(), "ca [1 4] 0");  // though the trace would take the other c
-    click(9);
-    click(2, Qt::RightButton);
-    EXPECT_EQ(entry(), "ca [1 4] 1");
+    EXPECT_EQ(clicking({4, 1}), "ca [1 4] 0");  // though the trace would take the other c
+    mouse(QEvent::MouseButtonPress, 2, {40, 40}, Qt::RightButton);
+    mouse(QEvent::MouseButtonRelease, 2, {40, 40}, Qt::RightButton);
+    EXPECT_EQ(clicking({9}), "ca [1 4] 1");
     clickTiles({2, 2});
     EXPECT_EQ(words(), Words{"cat"});
     EXPECT_EQ(entry(), " [] 1");
@@ -71,16 +64,12 @@ TEST_F(WordEntry, ClicksLightWhatWasClickedAndTheLastOneSubmits) {
 TEST_F(WordEntry, DoubleClickAppendsAndSubmitsOnce) {
     clickTiles({0, 1});
     doubleClick(2);
-    EXPECT_EQ(words(), Words{"cat"});
-    EXPECT_EQ(entry(), " [] 0");
     type("coa");
     doubleClick(2);  // the letters typed are no clicks: a second t is tried, and warned of
     EXPECT_EQ(words(), (Words{"coat", "cat"}));
     EXPECT_EQ(entry(), " [] 1");
     // Two tiles clicked in a hurry near their border are two clicks.
-    click(4);
-    mouse(QEvent::MouseButtonPress, 5, {95, 40});
-    mouse(QEvent::MouseButtonRelease, 5, {95, 40});
+    clickTiles({4, 5});
     mouse(QEvent::MouseButtonDblClick, 6, {1, 40});
     mouse(QEvent::MouseButtonRelease, 6, {1, 40});
     EXPECT_EQ(entry(), "bon [4 5 6] 1");
@@ -92,11 +81,12 @@ TEST_F(WordEntry, ClearTakesBackTheLastClickOrLetter) {
     EXPECT_EQ(clearing(), "ca [0 1] 0");
     // in step again, and clicked last: submitted, but too short
     EXPECT_EQ(clicking({1}), "ca [0 1] 0");
+    // the clicks are forgotten by that: this is a second a
+    EXPECT_EQ(clicking({1}), "ca [0 1] 1");
     press("Clear");
-    EXPECT_EQ(clearing(), " [] 0");
-    EXPECT_EQ(State.PickedCount, 0);
+    EXPECT_EQ(clearing(), " [] 1");
     type("tone");
-    EXPECT_EQ(clearing(), "ton [2 5 6] 0");
+    EXPECT_EQ(clearing(), "ton [2 5 6] 1");
 }
 
 TEST_F(WordEntry, ClicksStayInTheirSlots) {
@@ -104,17 +94,50 @@ TEST_F(WordEntry, ClicksStayInTheirSlots) {
         click(i % CubeCount);
         replaceAll("");
     }
-    const std::string picked = State.PickedWord;
     EXPECT_EQ(clicking({1}), " [] 1");
     EXPECT_EQ(State.PickedCount, PickedSlots);
-    EXPECT_EQ(State.PickedWord, picked);
-    start("QITAKENSHORDGLUB");
-    click(0);
-    for (int i = 0; i < 2; ++i) {  // more letters are taken back than clicks
-        type("i");
-        press("Clear");
-        EXPECT_EQ(State.PickedCount, 0);
+}
+
+TEST_F(WordEntry, WordsAreListedNewestFirstAndUnknownOnesStruckThrough) {
+    enter({"cat"});
+    EXPECT_EQ(text("PlayerWordLabel"), "1 word entered");
+    type("sta");
+    key(Qt::Key_Enter, Qt::KeypadModifier);
+    type("bone");
+    press("Enter");
+    enter({"cat"});  // entered already: silently gone
+    EXPECT_EQ(words(), (Words{"bone", "sta", "cat"}));
+    EXPECT_EQ(words("WordList", true), Words{"sta"});
+    EXPECT_EQ(text("PlayerWordLabel"), "3 words entered");
+    EXPECT_EQ(entry(), " [] 1");
+    enter({"cats", "coat", "con", "bon", "won", "one", "ton", "tone", "ten", "net"});
+    auto& list = *control<QTableWidget>("WordList");
+    list.scrollToBottom();
+    enter({"now"});
+    EXPECT_EQ(list.rowAt(0), 0);
+}
+
+TEST_F(WordEntry, TheLimitsOfTheMomentCount) {
+    cSetMinWordSize(2);
+    cSetMaxWordSize(3);
+    enter({"ca", "cats"});
+    EXPECT_EQ(words(), Words{"ca"});
+    EXPECT_EQ(entry(), " [] 1");
+}
+
+TEST_F(WordEntry, ReturnSubmitsWhereverTheFocusIs) {
+    for (const auto& [name, word] :
+         {std::pair("WordList", "cat"), {"Clear", "won"}, {"Exit", "ten"}}) {
+        type(word);
+        control(name)->setFocus();
+        key(Qt::Key_Return);
+        EXPECT_EQ(words().front(), word);
     }
+    type("con");
+    press("Clear");  // buttons and tiles leave the focus where it is
+    click(6);
+    type("e");
+    EXPECT_EQ(typed(), "cone");
 }
 
 }  // namespace

@@ -1,8 +1,4 @@
 // One game from Start to its end, and the clock.
-#include <QTest>
-#include <QTimer>
-
-#include "platform/platform.h"
 #include "support/program_fixture.h"
 
 namespace {
@@ -12,11 +8,21 @@ class GameFlow : public PlayedBoard {
     std::string times() { return text("TimeRemLabel") + " " + text("TimeLeft"); }
 };
 
-TEST_F(GameFlow, AWholeGameRunsOut) {
+TEST_F(GameFlow, AWholeGameRunsOutButNotInAPause) {
     State.TimeLimit = 15;
-    start("CATSBONEWILDHEFY");
-    EXPECT_EQ(times(), "Time Remaining 0:15");
+    start("QITAKENSHORDGLUB");
+    enter({"ten"});
+    clickTiles({0, 1});
+    start();  // drops that game
+    EXPECT_EQ(times() + text("PlayerWordLabel") + entry(), "Time Remaining 0:15 [] 0");
+    EXPECT_EQ(State.PickedWord, "");
     EXPECT_EQ(text("DefinedWordCount"), "Quorle found 7 words");
+    boxes_.expectPause([this] {
+        EXPECT_FALSE(isShown("CubeFrame"));
+        tick(3);
+    });
+    press("Pause");
+    EXPECT_TRUE(isShown("CubeFrame"));
     enter({"cat"});
     type("bo");
     tick(14);
@@ -27,69 +33,26 @@ TEST_F(GameFlow, AWholeGameRunsOut) {
     EXPECT_TRUE(isShown("Results"));
     EXPECT_EQ(words(), Words{"cat"});
     EXPECT_EQ(entry(), " [] 0");
-    EXPECT_FALSE(control("NewWord")->isEnabled());
-}
-
-TEST_F(GameFlow, StartDropsARunningGame) {
-    start("CATSBONEWILDHEFY");
-    enter({"cat"});
-    clickTiles({4, 5});
-    tick(5);
-    start("QITAKENSHORDGLUB");
-    EXPECT_EQ(times() + text("PlayerWordLabel") + entry(), "Time Remaining 3:00 [] 0");
-    EXPECT_EQ(State.PickedWord + std::to_string(State.PickedCount), "0");
-    EXPECT_EQ(text("DefinedWordCount"), "Quorle found 1 words");
-}
-
-TEST_F(GameFlow, APauseHidesTheBoardAndCostsNoTime) {
-    start("CATSBONEWILDHEFY");
-    tick();
-    type("ca");
-    boxes_.expect("Game paused", "Hit OK when ready to resume.", QMessageBox::Ok, QMessageBox::Ok,
-                  [this] {
-                      EXPECT_FALSE(isShown("CubeFrame"));
-                      tick(3);
-                      click(2);  // the box is modal
-                  });
-    press("Pause");
-    EXPECT_TRUE(isShown("CubeFrame"));
-    EXPECT_EQ(times(), "Time Remaining 2:59");
-    EXPECT_TRUE(comesToFront("Main"));
-    EXPECT_EQ(typing("t"), "cat [0 1 2] 0");
 }
 
 TEST_F(GameFlow, TheClockCountsOnlyWithItsWindowInFront) {
-    const auto inFront = Platform::WindowInFront;
-    start("CATSBONEWILDHEFY");
-    Platform::WindowInFront = [] { return 0; };
+    start();
+    const auto inFront = std::exchange(Platform::WindowInFront, [] { return 0; });
     tick();  // no window of ours: counts, and records none
-    EXPECT_EQ(State.ClockWindow, 0);
     Platform::WindowInFront = inFront;
-    boxes_.expectMessage("Wait.", [this] { tick(2); });
+    boxes_.expect("Wait.", QMessageBox::Ok, [this] { tick(2); });
     Platform::ShowMessage("Wait.", "Quorle");  // stands for its window once, when that is recorded
-    EXPECT_EQ(State.ClockWindow, 1);
     EXPECT_EQ(times(), "Time Remaining 2:58");
-    for (const bool closed : {true, false}) {
-        bringToFront("Main");
-        press("End");
-        start("CATSBONEWILDHEFY");
-        bringToFront("Results");
-        tick(3);
-        EXPECT_EQ(times(), "Time Remaining 3:00");
-        seconds_ += 3;
-        closed ? closeByTitleBar("Results") : press("Results/ResultsOK");
-        EXPECT_TRUE(comesToFront("Main"));
-        tick();
-        EXPECT_EQ(times(), "Time Remaining 2:59");
-    }
-}
-
-TEST_F(GameFlow, TheRealClockFires) {
-    auto& timer = *control("Main")->findChild<QTimer*>("GameClock");
-    timer.setInterval(1000);
-    EXPECT_EQ(timer.timerType(), Qt::PreciseTimer);
-    start("CATSBONEWILDHEFY");
-    EXPECT_TRUE(QTest::qWaitFor([&] { return times() == "Time Remaining 2:59"; }, 10000));
+    press("Main/End");
+    start();
+    bringToFront("Results");
+    tick(3);
+    EXPECT_EQ(times(), "Time Remaining 3:00");
+    seconds_ += 3;
+    press("Results/ResultsOK");
+    EXPECT_TRUE(comesToFront("Main"));
+    tick();
+    EXPECT_EQ(times(), "Time Remaining 2:59");
 }
 
 }  // namespace

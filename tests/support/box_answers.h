@@ -1,6 +1,8 @@
 #pragma once
 // Answers the program's modal windows, each when it is up and only if it is the
 // one expected.
+#include <gtest/gtest.h>
+
 #include <QMessageBox>
 #include <QTimer>
 #include <deque>
@@ -9,38 +11,35 @@
 
 class BoxAnswers {
   public:
+    using Act = std::function<void(QWidget&)>;
+
     BoxAnswers();
+    ~BoxAnswers() { EXPECT_TRUE(expected_.empty()) << "an expected window has not come"; }
 
-    /// The next modal window is a message box with this title, text and buttons;
-    /// `whileUp` runs in front of it, then `answer` is pressed.
-    void expect(const std::string& title, const std::string& text,
-                QMessageBox::StandardButtons buttons, QMessageBox::StandardButton answer,
-                const std::function<void()>& whileUp = {});
-
-    /// The same for a message of the program, and for one of its questions.
-    void expectMessage(const std::string& text, const std::function<void()>& whileUp = {}) {
-        expect("Quorle", text, QMessageBox::Ok, QMessageBox::Ok, whileUp);
+    /// The next modal window is a message box with this text, and an OK or a Yes and
+    /// a No; `whileUp` runs in front of it, then `answer` is pressed.
+    void expect(const std::string& text, QMessageBox::StandardButton answer = QMessageBox::Ok,
+                const std::function<void()>& whileUp = {}, const std::string& title = "Quorle");
+    void expectPause(const std::function<void()>& whileUp) {
+        expect("Hit OK when ready to resume.", QMessageBox::Ok, whileUp, "Game paused");
     }
-    void expectQuestion(const std::string& text, QMessageBox::StandardButton answer,
-                        const std::string& title = "Quorle") {
-        expect(title, text, QMessageBox::Yes | QMessageBox::No, answer);
+    void expectSaveQuestion(QMessageBox::StandardButton answer,
+                            const std::function<void()>& whileUp = {}) {
+        expect("Dictionary has been updated, do you want to save it?", answer, whileUp,
+               "Save dictionary?");
     }
 
     /// The next modal window is handled by `act`, which has to close it.
-    void expectModal(const std::function<void(QWidget&)>& act);
+    void expectModal(const Act& act) { expected_.push_back(act); }
 
     /// Windows that are not expected are handled by `act` instead of failing the test.
-    void otherwise(const std::function<void(QWidget&)>& act) { otherwise_ = act; }
-
-    /// Fails when an expected window has not come.
-    void verify();
+    void otherwise(const Act& act) { otherwise_ = act; }
 
   private:
     void look();
 
     QTimer timer_;
-    std::deque<std::function<void(QWidget&)>> expected_;
-    bool busy_ = false;
-    int looksInVain_ = 0;
-    std::function<void(QWidget&)> otherwise_;
+    std::deque<Act> expected_;
+    Act otherwise_;
+    QWidget* inHand_ = nullptr;
 };

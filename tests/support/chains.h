@@ -8,11 +8,10 @@
 /// Board indexes of a chain, from its first cube on.
 using Chain = std::vector<int>;
 
-/// Gives every chain that goes on from `chain` and spells `rest` to `take`, smallest first, until
-/// that returns true. A Qu cube ("Q", "q") is "qu", or a "q" that ends the word.
-template <class Take>
-bool Spell(std::string_view board, std::string_view rest, Chain& chain, const Take& take) {
-    if (rest.empty()) return take(chain);
+/// Whether a chain can go on from `chain` and spell `rest`; it is then the first such, by its
+/// places. A Qu cube ("Q", "q") is "qu", or a "q" that ends the word.
+inline bool Spell(std::string_view board, std::string_view rest, Chain& chain) {
+    if (rest.empty()) return true;
     const int last = chain.empty() ? -1 : chain.back();
     for (int next = 0; next < 16; ++next) {
         const int rows = next / 4 - last / 4;
@@ -23,14 +22,20 @@ bool Spell(std::string_view board, std::string_view rest, Chain& chain, const Ta
         const bool qu = letter == 'q' && rest.size() > 1;
         if (rest[0] != letter || (qu && rest[1] != 'u')) continue;
         chain.push_back(next);
-        if (Spell(board, rest.substr(qu ? 2 : 1), chain, take)) return true;
+        if (Spell(board, rest.substr(qu ? 2 : 1), chain)) return true;
         chain.pop_back();
     }
     return false;
 }
 
-/// Whether the word lies on the board at all.
-inline bool Lies(std::string_view board, std::string_view word) {
+/// The first chain that spells the word, empty where none does.
+inline Chain FirstChain(std::string_view board, std::string_view word) {
     Chain chain;
-    return Spell(board, word, chain, [](const Chain&) { return true; });
+    Spell(board, word, chain);
+    return chain;
+}
+
+/// Whether the word, which is not empty, lies on the board at all.
+inline bool Lies(std::string_view board, std::string_view word) {
+    return !FirstChain(board, word).empty();
 }

@@ -1,26 +1,34 @@
 #include "support/game_fixture.h"
 
-#include <quorle/word_engine.h>
-
-#include <filesystem>
-
 #include "board/dice.h"
-#include "platform/platform.h"
-#include "support/boards.h"
 
 namespace {
 
 constexpr const char* KeyPath = "Software\\Kaldrun\\Quorle\\Default";
 
+// The numbers that draw a cube for each letter of the board, then its face.
+bool Draw(const std::string& board, std::vector<std::string> cubes, std::deque<float>& draws) {
+    if (draws.size() == 2 * CubeCount) return true;
+    const auto left = cubes.size();
+    for (std::size_t cube = 0; cube < left; ++cube) {
+        const auto face = cubes[cube].find(board.at(CubeCount - left));
+        if (face == std::string::npos) continue;
+        std::vector<std::string> others = cubes;
+        others.erase(others.begin() + static_cast<int>(cube));
+        draws.push_back((static_cast<float>(cube) + 0.5F) / static_cast<float>(left));
+        draws.push_back((static_cast<float>(face) + 0.5F) / 6);
+        if (Draw(board, others, draws)) return true;
+        draws.resize(draws.size() - 2);
+    }
+    return false;
+}
+
 }  // namespace
 
 void UseHome(const std::string& folder) {
-    for (const auto& [name, below] : {std::pair("HOME", ""),
-                                      {"XDG_CONFIG_HOME", "/config"},
-                                      {"XDG_DATA_HOME", "/data"},
-                                      {"XDG_CACHE_HOME", "/cache"},
-                                      {"XDG_RUNTIME_DIR", ""}}) {
-        setenv(name, (folder + below).c_str(), 1);
+    for (const char* name :
+         {"HOME", "XDG_CONFIG_HOME", "XDG_DATA_HOME", "XDG_CACHE_HOME", "XDG_RUNTIME_DIR"}) {
+        setenv(name, folder.c_str(), 1);
     }
 }
 
@@ -55,11 +63,13 @@ void GameFixture::useTestDesktop() {
 void GameFixture::makeDictionary(const std::vector<std::string>& words, int maximum) {
     resetProcess();
     cSetMaxWordSize(maximum);
-    for (const std::string& word : words) {
-        if (cDictionaryAdd(word.c_str()) != 1) ADD_FAILURE() << "no word: " << word;
-    }
+    for (const std::string& word : words) EXPECT_EQ(cDictionaryAdd(word.c_str()), 1) << word;
     EXPECT_EQ(cWriteBinaryDictionary((folder_ / "program/Dictionary.dat").c_str()), 1);
-    resetProcess();
+}
+
+int GameFixture::wordsInFile() const {
+    EXPECT_EQ(cReadBinaryDictionary((folder_ / "program/Dictionary.dat").c_str()), 1);
+    return cNumberOfWords();
 }
 
 void GameFixture::store(const std::string& name, const std::string& text) {
@@ -80,6 +90,7 @@ void GameFixture::putOnBoard(const std::string& board) {
 }
 
 void GameFixture::shakeNext(const std::string& board) {
-    const std::vector<float> draws = DrawsFor(board);
-    draws_.assign(draws.begin(), draws.end());
+    draws_.clear();
+    const auto& cubes = State.CubeFaces;
+    EXPECT_TRUE(Draw(board, {cubes.begin(), cubes.end()}, draws_)) << "no shake gives " << board;
 }

@@ -2,6 +2,7 @@
 // A program of its own for each test: fresh state, folders, settings and engine,
 // and a desktop that does what the test says. Names no Qt.
 #include <gtest/gtest.h>
+#include <quorle/word_engine.h>
 
 #include <deque>
 #include <random>
@@ -9,6 +10,7 @@
 #include <vector>
 
 #include "engine/temp_folder.h"
+#include "platform/platform.h"
 #include "state/game_state.h"
 
 class GameFixture : public testing::Test {
@@ -18,8 +20,11 @@ class GameFixture : public testing::Test {
     /// State and engine as in a new process.
     static void resetProcess();
 
-    /// Writes the program folder's dictionary, and leaves the engine as at start.
+    /// Writes the program folder's dictionary. The engine then holds it, too.
     void makeDictionary(const std::vector<std::string>& words, int maximum = 16);
+
+    /// How many words it holds now; the engine then holds them.
+    int wordsInFile() const;
 
     /// The settings file's values; an empty text where there is none.
     static void store(const std::string& name, const std::string& text);
@@ -32,7 +37,8 @@ class GameFixture : public testing::Test {
     /// Puts letters on the board as a shake would, without a window.
     static void putOnBoard(const std::string& board);
 
-    /// The next shake gives this board. Others are random, from a fixed seed.
+    /// The next shake gives this board of 16 letters, "Q" for the Qu face; fails
+    /// when none can. Others are random, from a fixed seed.
     void shakeNext(const std::string& board);
 
     TempFolder folder_;              ///< home, and below it the program folder
