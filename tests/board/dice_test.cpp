@@ -11,7 +11,7 @@ TEST_F(ShakenCubes, DrawACubeAndThenItsFaceForEachPlace) {
     Dice::FillCubeFaces();
     draws_.assign(32, 0x1.fffffep-1F);
     EXPECT_EQ(Dice::ShakeCubes(), "YLCNISBDUERRNBBP");
-    EXPECT_EQ(drawn_, 32);
+    EXPECT_TRUE(draws_.empty());
     // The tenth cube, just, and as that is taken the eleventh.
     draws_ = {9.05F / 16, 1.05F / 6, 9.05F / 15};
     draws_.resize(32);

@@ -3,6 +3,7 @@
 
 #include <algorithm>
 
+#include "board/dice.h"
 #include "engine/calls.h"
 #include "support/chains.h"
 #include "support/game_fixture.h"
@@ -27,7 +28,9 @@ TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
     for (int i = 0; i < 4000; ++i) {
         std::string board = Text(random, CubeCount, "AIRTU");  // most words have many chains
         if (i % 4 != 0) board[random() % CubeCount] = 'Q';
-        putOnBoard(board);
+        for (std::size_t k = 0; k < CubeCount; ++k) {
+            Dice::PutOnBoard(static_cast<std::int16_t>(k), board[k]);
+        }
         const std::string word = Text(random, 1 + random() % 6, "airtuq") + (i % 3 ? "" : "qu");
         SCOPED_TRACE(word + " on " + board);
         Chain expected = Marked();
@@ -46,26 +49,6 @@ TEST_F(Tracing, AgreesWithEveryChainSpelledOut) {
         EXPECT_FALSE(IsOnBoard(word));
     EXPECT_TRUE(IsOnBoard(""));
     EXPECT_EQ(Marked(), Chain{});
-}
-
-TEST_F(Tracing, AndTheEnginesSearchFindTheSameWords) {
-    ASSERT_EQ(cReadBinaryDictionary(QUORLE_DEFAULT_DICTIONARY), 1);
-    ASSERT_EQ(cDictionaryAdd("suq"), 1);
-    const WordSet all = AllWords();
-    Random random;
-    std::string board = "seaslrtneaiespmd";  // very many words
-    for (int i = 0; i < 5; ++i) {
-        const WordSet found = Found(cCheckForAllDefinedWords(board.c_str()));
-        std::transform(board.begin(), board.end(), board.begin(), ::toupper);
-        putOnBoard(board);
-        WordSet traced;
-        for (const std::string& word : all) {
-            if (word.size() > 2 && IsOnBoard(word)) traced.insert(word);
-        }
-        EXPECT_EQ(found, traced) << board;
-        EXPECT_TRUE(i > 0 || found.size() > 300);
-        board = Text(random, 15, "aeioustrnldpst") + 'q';
-    }
 }
 
 }  // namespace

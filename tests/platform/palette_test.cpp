@@ -9,10 +9,6 @@ using Palettes = RunningGame;
 // As some are: a large mark; a box too low for a frame has none, nor an arrow or margins.
 struct RoomyStyle : QProxyStyle {
     RoomyStyle() : QProxyStyle("Fusion") {}
-    QSize sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& size,
-                           const QWidget* widget) const override {
-        return QProxyStyle::sizeFromContents(type, option, size + QSize(0, 20), widget);
-    }
     int pixelMetric(PixelMetric, const QStyleOption*, const QWidget*) const override { return 30; }
     QRect subControlRect(ComplexControl, const QStyleOptionComplex* option, SubControl,
                          const QWidget*) const override {

@@ -34,17 +34,9 @@ class GameFixture : public testing::Test {
     /// show something.
     void useTestDesktop();
 
-    /// Puts letters on the board as a shake would, without a window.
-    static void putOnBoard(const std::string& board);
-
-    /// The next shake gives this board of 16 letters, "Q" for the Qu face; fails
-    /// when none can. Others are random, from a fixed seed.
-    void shakeNext(const std::string& board);
-
     TempFolder folder_;              ///< home, and below it the program folder
     std::deque<float> draws_;        ///< the next numbers of the random source
     std::mt19937 randomness_;        ///< the numbers after those
-    int drawn_ = 0;                  ///< numbers taken
     int warnings_ = 0;               ///< warning sounds asked for
     std::vector<std::string> told_;  ///< what a screen reader would say
     double seconds_ = 1000;          ///< the steady clock

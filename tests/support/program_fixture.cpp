@@ -39,7 +39,8 @@ void ProgramFixture::launch() {
 }
 
 void ProgramFixture::start(const std::string& board) {
-    shakeNext(board);
+    for (std::size_t k = 0; k < CubeCount; ++k) State.CubeFaces[k].assign(6, board.at(k));
+    draws_.assign(2 * CubeCount, 0);
     press("Start");
 }
 

@@ -24,7 +24,8 @@ class ProgramFixture : public GameFixture {
     static void endProgram();
 
     // What the player does.
-    void start(const std::string& board = "CATSBONEWILDHEFY");  ///< presses Start
+    /// Presses Start; the cubes lie in the board's order and have but one letter each.
+    void start(const std::string& board = "CATSBONEWILDHEFY");
     void press(const std::string& name) { clickOn(*control(name), control(name)->rect().center()); }
     void type(const std::string& text);  ///< key by key
     void key(Qt::Key key, Qt::KeyboardModifiers with = {}) {
