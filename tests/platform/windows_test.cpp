@@ -80,18 +80,16 @@ TEST_F(WindowsOfTheDesktop, OnWaylandNoneResistsBeingMaximised) {
     const QWidget& letters = *control("StartingLetters");
     const QPoint corner = letters.mapTo(letters.window(), QPoint());
     letters.window()->windowHandle()->resize(2000, 1500);
-    QTest::qWait(0);
-    EXPECT_EQ(letters.window()->width(), 2000);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return letters.window()->width() == 2000; }));
     EXPECT_EQ(letters.mapTo(letters.window(), QPoint()), corner);
     boxes_.expectPause([] {
         QWidget& box = *QApplication::activeModalWidget();
-        QTest::qWait(1);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return box.maximumWidth() > box.width(); }));
         const QSize least = box.size();
-        EXPECT_GT(box.maximumWidth(), least.width());
         box.showMaximized();
-        QTest::qWait(1);
+        EXPECT_TRUE(QTest::qWaitFor([&] { return box.width() > least.width(); }));
         QCoreApplication::postEvent(&box, new QEvent(QEvent::LayoutRequest));
-        QTest::qWait(1);
+        QCoreApplication::processEvents();
         EXPECT_GT(box.width(), least.width());
         EXPECT_EQ(box.minimumSize(), least);
     });
