@@ -5,7 +5,6 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QLabel>
-#include <QLineEdit>
 #include <QListView>
 #include <QSignalBlocker>
 #include <QStringListModel>
@@ -91,7 +90,6 @@ void ShowEditor() {
     const bool elsewhere = !Platform::FrontIsOurs();
     editor.waits = (playing || elsewhere) && Platform::OnWayland();
     if (editor.waits) return;
-    editor.NewWord->setFocus();
     const bool boxIsUp = QApplication::activeModalWidget() != nullptr;
     if (playing || boxIsUp || elsewhere) {
         Platform::ShowBehind(editor);
