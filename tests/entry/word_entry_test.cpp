@@ -3,14 +3,7 @@
 
 namespace {
 
-class WordEntry : public RunningGame {
-  protected:
-    // Straight to a tile, for sequences that no single click makes.
-    void mouse(QEvent::Type type, int tile, QPointF place, Qt::MouseButton by = Qt::LeftButton) {
-        QMouseEvent event(type, place, place, by, by, {});
-        QCoreApplication::sendEvent(control("Cube" + std::to_string(tile)), &event);
-    }
-};
+using WordEntry = RunningGame;
 
 TEST_F(WordEntry, TypingLightsTheChainAndTakesTheRestOff) {
     const QImage unlit = control("Cube5")->grab().toImage();
@@ -44,8 +37,7 @@ TEST_F(WordEntry, QuIsOneCube) {
 TEST_F(WordEntry, ClicksLightWhatWasClickedAndTheLastOneSubmits) {
     start("CATSCONEWILDHEFY");
     EXPECT_EQ(clicking({4, 1}), "ca [1 4] 0");  // though the trace would take the other c
-    mouse(QEvent::MouseButtonPress, 2, {40, 40}, Qt::RightButton);
-    mouse(QEvent::MouseButtonRelease, 2, {40, 40}, Qt::RightButton);
+    QTest::mouseClick(control("Cube2"), Qt::RightButton);
     EXPECT_EQ(clicking({9}), "ca [1 4] 1");
     clickTiles({2, 2});
     EXPECT_EQ(words(), Words{"cat"});
@@ -56,8 +48,8 @@ TEST_F(WordEntry, ClicksLightWhatWasClickedAndTheLastOneSubmits) {
     // a click goes on from what was typed, and the trace is lit
     EXPECT_EQ(clicking({3}), "cats [0 1 2 3] 2");
     replaceAll("");
-    mouse(QEvent::MouseButtonPress, 0, {40, 40});
-    mouse(QEvent::MouseButtonRelease, 0, {-3, 40});
+    QTest::mousePress(control("Cube0"), Qt::LeftButton);
+    QTest::mouseRelease(control("Cube0"), Qt::LeftButton, {}, {-3, 40});
     EXPECT_EQ(typed(), "");
 }
 
@@ -70,8 +62,8 @@ TEST_F(WordEntry, DoubleClickAppendsAndSubmitsOnce) {
     EXPECT_EQ(entry(), " [] 1");
     // Two tiles clicked in a hurry near their border are two clicks.
     clickTiles({4, 5});
-    mouse(QEvent::MouseButtonDblClick, 6, {1, 40});
-    mouse(QEvent::MouseButtonRelease, 6, {1, 40});
+    QTest::mouseEvent(QTest::MouseDClick, control("Cube6"), Qt::LeftButton, {}, {1, 40});
+    QTest::mouseRelease(control("Cube6"), Qt::LeftButton, {}, {1, 40});
     EXPECT_EQ(entry(), "bon [4 5 6] 1");
 }
 
@@ -122,9 +114,11 @@ TEST_F(WordEntry, WordsAreListedNewestFirstAndUnknownOnesStruckThrough) {
 
 TEST_F(WordEntry, ReturnSubmitsWhereverTheFocusIs) {
     for (const auto& [name, word] :
-         {std::pair("WordList", "cat"), {"Clear", "won"}, {"Exit", "ten"}}) {
+         {std::pair("Clear", "won"), {"WordList", "cat"}, {"Exit", "ten"}}) {
         type(word);
         control(name)->setFocus();
+        key(Qt::Key_Tab);
+        EXPECT_FALSE(control(name)->hasFocus());
         key(Qt::Key_Return);
         EXPECT_EQ(words().front(), word);
     }

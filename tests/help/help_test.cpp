@@ -21,6 +21,7 @@ TEST_F(Help, WalksThroughTheHistoryThatTheTitleBarDrops) {
     EXPECT_EQ(after("Back"), "Quorle.htm");
     viewer().setFocus();
     key(Qt::Key_Tab);
+    EXPECT_EQ(told_, Words{"link more"});
     key(Qt::Key_Return);  // follows the link
     EXPECT_EQ(viewer().toPlainText(), "More");
     EXPECT_EQ(after("Back"), "Quorle.htm");
@@ -29,6 +30,8 @@ TEST_F(Help, WalksThroughTheHistoryThatTheTitleBarDrops) {
     after("Exit");
     EXPECT_FALSE(isShown("HelpBrowser"));
     press("HelpButton");
+    EXPECT_EQ(after("Back"), "more.htm");
+    press("HelpButton");  // an open one, too, begins with the contents
     EXPECT_EQ(after("Back"), "more.htm");
     closeByTitleBar("HelpBrowser");
     press("HelpButton");

@@ -1,6 +1,4 @@
 // What a screen reader is told while a game is played without looking.
-#include <QSignalSpy>
-
 #include "support/program_fixture.h"
 
 namespace {
@@ -39,7 +37,7 @@ TEST_F(Heard, TheBoardThenWhatBecomesOfEachLetterAndWord) {
     EXPECT_EQ(heard(), (Words{"1 minute left", "30 seconds left", "10 seconds left"}));
 }
 
-TEST_F(Heard, TheSummaryThenAResultsPlacesAndItsCorrection) {
+TEST_F(Heard, TheSummaryThenAResultsPlaces) {
     start();
     enter({"cat", "sta"});
     tick(180);
@@ -50,17 +48,11 @@ TEST_F(Heard, TheSummaryThenAResultsPlacesAndItsCorrection) {
     EXPECT_EQ(
         control<QListWidget>("BadWords")->selectedItems()[0]->data(Qt::AccessibleDescriptionRole),
         "not in dictionary, row 1 column 4, row 1 column 3, row 1 column 2");
-    heard();
-    press("AddToDict");
-    EXPECT_EQ(heard(), Words{"sta added. " + summary()});
-    select("DictWords", "cat");
-    press("RemoveFromDict");
-    EXPECT_EQ(heard(), Words{"cat removed. " + summary()});
     press("End");
     EXPECT_EQ(control("Results")->focusWidget(), control("ResultsOK"));
 }
 
-TEST_F(Heard, OptionsAndTheEditorsWords) {
+TEST_F(Heard, WhatIsChosenInABox) {
     constexpr bool ToolkitTellsBoxes = QT_VERSION >= QT_VERSION_CHECK(6, 8, 0);
     for (const auto& [opens, box] :
          {std::pair("Options", "MinWordSizeCombo"), {"Dictionary", "StartingLetters"}}) {
@@ -73,11 +65,6 @@ TEST_F(Heard, OptionsAndTheEditorsWords) {
         EXPECT_EQ(heard(), ToolkitTellsBoxes ? Words{} : Words{value});
         EXPECT_TRUE(ToolkitTellsBoxes || description(box).starts_with(value + ". "));
     }
-    control("DictionaryEditor/NewWord")->setFocus();
-    EXPECT_EQ(entering("zoo"), Words{"zoo added. 10 words"});
-    select("DictionaryEditor/WordList", "cat");
-    press("Remove");
-    EXPECT_EQ(heard(), Words{"cat removed. 9 words"});
 }
 
 // A reader follows the current cell, so it must not move while words are typed; and
@@ -92,26 +79,15 @@ TEST_F(Heard, NoRowWhileTypingAndTheOnlyOneOfAListWhenReached) {
     press("End");
     auto& words = *control<QListWidget>("UserWords");
     words.setFocus();
-    QCoreApplication::processEvents();
-    EXPECT_TRUE(words.selectedItems().isEmpty());
     QSignalSpy reached(&words, &QListWidget::currentRowChanged);
     key(Qt::Key_Down);
-    ASSERT_FALSE(reached.isEmpty());
-    EXPECT_EQ(reached.last().first(), 0);
+    EXPECT_EQ(reached.value(1).value(0), 0);  // after none was
     EXPECT_EQ(litResults(), (Tiles{0, 1, 2}));
     control("ResultsOK")->setFocus();
     reached.clear();
     words.setFocus();
     ASSERT_TRUE(QTest::qWaitFor([&] { return reached.count() == 2; }));
     EXPECT_EQ(reached.last().first(), 0);
-}
-
-TEST_F(Heard, TheLinksOfTheHelp) {
-    folder_.write("program/Quorle.htm", "<p>Help</p><p><a href=\"#end\">the end</a></p>");
-    press("HelpButton");
-    bringToFront("HelpBrowser");
-    key(Qt::Key_Tab);
-    EXPECT_EQ(heard(), Words{"link the end"});
 }
 
 }  // namespace

@@ -61,12 +61,10 @@ TEST_F(WindowsOfTheDesktop, AFrontThatWasOnlyAskedForIsGivenBackToo) {
 TEST_F(WindowsOfTheDesktop, OnWaylandOneLeftOpenIsShownAnew) {
     Platform::OnWayland = [] { return true; };
     press("Options");
-    int shown = 0;
-    QObject::connect(control("OptionsDialog")->windowHandle(), &QWindow::visibleChanged,
-                     [&shown](bool visible) { shown += visible; });
+    const QSignalSpy shown(control("OptionsDialog")->windowHandle(), &QWindow::visibleChanged);
     press("Options");
     EXPECT_TRUE(comesToFront("OptionsDialog"));
-    EXPECT_EQ(shown, 1);
+    EXPECT_EQ(shown.count(), 2);  // after it was hidden
 }
 
 TEST_F(WindowsOfTheDesktop, OnWaylandNoneResistsBeingMaximised) {

@@ -30,6 +30,7 @@ void BoxAnswers::expect(const std::string& text, QMessageBox::StandardButton ans
 void BoxAnswers::look() {
     QWidget* window = QApplication::activeModalWidget();
     if (window == nullptr || window == inHand_) return;
+    timer_.start();  // or it would not go off while a box that opens over this one waits
     QWidget* below = std::exchange(inHand_, window);
     EXPECT_TRUE(QTest::qWaitFor([=] { return window->isActiveWindow(); }))
         << "not in front: " << window->windowTitle().toStdString();

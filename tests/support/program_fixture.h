@@ -2,7 +2,7 @@
 // The real program, offscreen, used as a player uses it: keys go where the focus
 // is, mouse clicks to whatever is on top. Controls go by their names, those of the
 // main window first; "Results/ResultsOK" is the one in that window.
-#include <QTest>
+#include <QtTest>
 #include <QtWidgets>
 #include <stdexcept>
 
