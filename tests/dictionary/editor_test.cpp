@@ -19,7 +19,7 @@ TEST_F(Editor, AddsTypedWordsOneAfterAnotherButNoneThatIsNoWord) {
     type("cow");
     select("DictionaryEditor/WordList", "cat");
     key(Qt::Key_Enter, Qt::KeypadModifier);
-    EXPECT_EQ(told_.back(), "cow added. 8 words");
+    EXPECT_EQ(lastTold(), "cow added. 8 words");
 }
 
 TEST_F(Editor, RemovesTheSelectedWordAndKeepsThePrefixWhileItLasts) {
@@ -27,7 +27,7 @@ TEST_F(Editor, RemovesTheSelectedWordAndKeepsThePrefixWhileItLasts) {
     select("DictionaryEditor/WordList", "cat");
     press("Remove");
     EXPECT_EQ(shown(), "BO CA ZO | CA: cab | 3 words");
-    EXPECT_EQ(told_.back(), "cat removed. 3 words");
+    EXPECT_EQ(lastTold(), "cat removed. 3 words");
     EXPECT_TRUE(State.DictionaryChanged);
     EXPECT_TRUE(control("DictionaryEditor/WordList")->hasFocus());
     boxes_.expect("You must select a word to remove.");

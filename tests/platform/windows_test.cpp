@@ -4,16 +4,7 @@
 
 namespace {
 
-class WindowsOfTheDesktop : public PlayedBoard {
-  protected:
-    void expectNameTyped(const std::string& name) {
-        boxes_.expectModal([=](QWidget& dialog) {
-            auto* edit = dialog.findChild<QLineEdit*>();
-            edit->setText(QString::fromStdString(name));
-            QTest::keyClick(edit, Qt::Key_Return);
-        });
-    }
-};
+using WindowsOfTheDesktop = PlayedBoard;
 
 TEST_F(WindowsOfTheDesktop, OnlyItsButtonsAnswerAQuestionAndTheFrontComesBack) {
     for (const auto answer : {QMessageBox::No, QMessageBox::Yes}) {
@@ -29,6 +20,12 @@ TEST_F(WindowsOfTheDesktop, OnlyItsButtonsAnswerAQuestionAndTheFrontComesBack) {
 }
 
 TEST_F(WindowsOfTheDesktop, ASavedFileGetsASuffixAndIsReplacedOnlyWhenAllowed) {
+    const auto expectNameTyped = [this](const std::string& name) {
+        boxes_.expectModal([=, this](QWidget& dialog) {
+            dialog.findChild<QLineEdit*>()->setText(QString::fromStdString(name));
+            key(Qt::Key_Return);
+        });
+    };
     const std::string folder = folder_.path();
     for (const auto& [typed, saved] : {std::pair("words", "/words.txt"), {"a.list", "/a.list"}}) {
         expectNameTyped(typed);
@@ -42,6 +39,7 @@ TEST_F(WindowsOfTheDesktop, ASavedFileGetsASuffixAndIsReplacedOnlyWhenAllowed) {
     }
     expectNameTyped("words.txt");
     EXPECT_EQ(Platform::ChooseFileToOpen(folder), folder + "/words.txt");
+    EXPECT_TRUE(comesToFront("Main"));
 }
 
 // A box closes: the front is asked for, and the window hides before it comes.

@@ -73,7 +73,7 @@ TEST_F(GameResults, WordsGoIntoTheDictionaryAndOutOfIt) {
     EXPECT_EQ(lists(), "cat con | boned [sta] | bone cat cats coat con ten tone won | ");
     EXPECT_EQ(litResults(), (Tiles{1, 2, 3}));
     EXPECT_EQ(State.DictionaryChanged, True);
-    EXPECT_EQ(told_.back(), "con added. " + summary());
+    EXPECT_EQ(lastTold(), "con added. " + summary());
     press("AddToDict");
     EXPECT_EQ(litResults(), (Tiles{4, 5, 6, 7, 11}));
     press("AddToDict");
@@ -82,7 +82,7 @@ TEST_F(GameResults, WordsGoIntoTheDictionaryAndOutOfIt) {
               "0 words not in dictionary");
     take("DictWords", "cat");
     take("DictWords", "won");
-    EXPECT_EQ(told_.back(), "won removed. " + summary());
+    EXPECT_EQ(lastTold(), "won removed. " + summary());
     EXPECT_EQ(lists(), "boned con sta | cat won | bone boned cats coat con sta ten tone | ");
     EXPECT_EQ(cNumberOfWords(), 9 + 1);
     take("BadWords", "won");  // which was never entered

@@ -54,6 +54,7 @@ class ProgramFixture : public GameFixture {
         return control(name)->property(property).toString().toStdString();
     }
     std::string description(const std::string& of) { return text(of, "accessibleDescription"); }
+    std::string lastTold() { return told_.empty() ? "nothing" : told_.back(); }
     std::string typed() { return text("NewWord"); }
     Tiles litTiles(const std::string& tiles = "Cube");
     Tiles litResults() { return litTiles("ResultCubes"); }
