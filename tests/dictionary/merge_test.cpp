@@ -34,8 +34,9 @@ class Merging : public OpenEditor {
 
 TEST_F(Merging, ASmallFileIsInAtOnce) {
     merge("empty", "");
-    EXPECT_TRUE(ends() && State.DictionaryChanged);  // though it brings nothing
-    EXPECT_TRUE(QTest::qWaitFor([this] {             // on a busy machine not at the first try
+    EXPECT_TRUE(ends() && State.DictionaryChanged);
+    // On a busy machine not at the first try.
+    EXPECT_TRUE(QTest::qWaitFor([this] {
         prefixes().setCurrentText("ZO");
         merge("small", "Dog\r\ncat  ant\nx-ray a1 abcdefghijklmnopq\nowl");
         return !isShown("Progress");
