@@ -102,8 +102,10 @@ TEST_F(WordEntry, WordsAreListedNewestFirstAndUnknownOnesStruckThrough) {
     EXPECT_EQ(words("WordList", true), Words{"sta"});
     EXPECT_EQ(text("PlayerWordLabel"), "3 words entered");
     EXPECT_EQ(entry(), " [] 1");
-    enter({"cats", "coat", "con", "bon", "won", "one", "ton", "tone", "ten", "net"});
+    enter({"cats", "coat", "con", "bon", "won", "one", "ton", "tone", "ten", "catsenobwildyfeh"});
     auto& list = *control<QTableWidget>("WordList");
+    EXPECT_LT(QFontMetrics(list.item(0, 0)->font()).horizontalAdvance(words()[0].data()),
+              list.width());
     list.scrollToBottom();
     cSetMinWordSize(2);
     cSetMaxWordSize(3);

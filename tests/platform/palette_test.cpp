@@ -51,6 +51,16 @@ TEST_F(Palettes, WhatTheDesktopWouldHaveLargerIsDrawnWhole) {
     EXPECT_GT(control("TimeCombo")->findChild<QLineEdit*>()->x(), 0);
 }
 
+TEST_F(Palettes, AnEmptyListShowsThatItHasTheFocus) {
+    LegibleStyle style;
+    press("End");
+    QWidget& list = *control("UserWords");
+    list.setStyle(&style);
+    list.setFocus();
+    EXPECT_TRUE(comesToFront("Results"));
+    EXPECT_EQ(list.grab().toImage().pixelColor(0, 9), list.palette().color(QPalette::Highlight));
+}
+
 TEST_F(Palettes, ADesktopThatTurnsDarkChangesTilesAndPicturesButNoColourOfOurs) {
     press("End");
     select("DictWords", "cat");
