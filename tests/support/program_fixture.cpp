@@ -8,11 +8,16 @@ bool ProgramFixture::comesToFront(const QWidget& window) {
     return QTest::qWaitFor([&] { return QApplication::activeWindow() == &window; }, 2000);
 }
 
-// A desktop brings a window that is clicked to the front; there is none here.
+// A desktop brings a window that is clicked to the front; there is none here. When a
+// merge ends meanwhile and shows the editor, the player clicks again.
 void ProgramFixture::activate(QWidget& window) {
     QCoreApplication::processEvents();  // what the program still does about its windows
-    window.activateWindow();
-    if (!comesToFront(window)) throw std::logic_error("not in front");
+    const bool inFront = QTest::qWaitFor([&] {
+        const bool active = QApplication::activeWindow() == &window;
+        if (!active) window.activateWindow();
+        return active;
+    });
+    if (!inFront) throw std::logic_error("not in front");
 }
 
 void ProgramFixture::clickOn(const QWidget& widget, const QPoint& place) {
