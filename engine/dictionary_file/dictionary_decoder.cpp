@@ -82,7 +82,7 @@ class Decoder {
         edges_ = store->edges();
         nodes_.resize(MostWaiting + 1 + std::size_t{header_.shared});
         if (!readTables() || !readAllNodes() || !isFinished()) return nullptr;
-        store->closeBase({nodes_[0].letters, nodes_[0].first});
+        store->closeBase({nodes_[0].first, nodes_[0].letters});
         return store;
     }
 
@@ -152,7 +152,7 @@ class Decoder {
             const Node& child = nodes[MostWaiting + (place >> 1) - toNew];
             waiting -= isNew;
             words += place & 1;
-            *edge = {child.letters | place << 31, child.first, static_cast<std::uint32_t>(words)};
+            *edge = {child.first, child.letters | place << 31, static_cast<std::uint32_t>(words)};
             words += child.words;
             height = std::max(height, child.height + 1);
         }
@@ -173,7 +173,7 @@ class Decoder {
 
     // Exactly one node has no parent, all counts are used up, and no word has one letter only.
     bool isFinished() const {
-        const Edge root{nodes_[0].letters, nodes_[0].first};
+        const Edge root{nodes_[0].first, nodes_[0].letters};
         const std::span edges(edges_ + root.first, root.count());
         return edge_ == header_.edges + 1 && nodeCount_ == header_.nodes &&
                shared_ == header_.shared && waiting_ == std::min(nodeCount_, 1U) &&

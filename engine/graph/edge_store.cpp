@@ -21,7 +21,7 @@ void EdgeStore::reserve(std::size_t count) {
     if (needed <= capacity_) return;
     if (needed > MostEdges) throw std::bad_alloc();
     const std::size_t capacity = std::max(needed, capacity_ + capacity_ / 8);
-    Resize(edges_, capacity);
+    Resize(edges_, capacity + 1);
     capacity_ = capacity;
 }
 
@@ -34,7 +34,8 @@ std::uint32_t EdgeStore::append(std::size_t count) {
 void EdgeStore::closeBase(const Edge& root) {
     edges_[0] = root;
     baseEnd_ = static_cast<std::uint32_t>(size_);
-    Resize(edges_, capacity_ = size_);
+    capacity_ = size_;
+    Resize(edges_, capacity_ + 1);
 }
 
 std::uint32_t EdgeStore::allocate(std::uint32_t count) {

@@ -19,11 +19,10 @@ namespace Quorle {
 inline constexpr int Letters = 26;
 inline constexpr std::uint32_t WordEnds = 1U << 31;
 
-struct alignas(16) Edge {
+struct Edge {
+    std::uint32_t first = 0;    ///< index of the first edge of the letters; 0 when there are none
     std::uint32_t letters = 0;  ///< bit i: a word goes on with letter i; WordEnds: one ends here
-    std::uint32_t first = 0;    ///< index of the first edge of those letters; 0 when there are none
     std::uint32_t before = 0;   ///< words of the node before this edge's letter, and this word
-    std::uint32_t none = 0;     ///< a search keeps something of its own here
 
     bool operator==(const Edge&) const = default;
     bool isWord() const { return letters >> 31 != 0; }
@@ -63,7 +62,8 @@ auto CountingBits(const Walk& walk) {
 /// How many words go on from the edge.
 std::uint32_t CountWords(const Edge* edges, const Edge& edge);
 
-/// Owns the array. Grows at its end; edited nodes that nothing leads to are used again.
+/// Owns the array, and room for one edge behind it, so that each can be read as 16 bytes. Grows at
+/// its end; edited nodes that nothing leads to are used again.
 class EdgeStore {
   public:
     EdgeStore() {

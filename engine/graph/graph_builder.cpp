@@ -67,7 +67,7 @@ WordGraph GraphBuilder::finish() {
 }
 
 WordGraph GraphBuilder::finish(const Edge& root) {
-    edges_->closeBase({root.letters, root.first});
+    edges_->closeBase({root.first, root.letters});
     return WordGraph(edges_);
 }
 
@@ -93,13 +93,13 @@ Edge GraphBuilder::store(const OpenNode& open) {
     const std::uint64_t hash = Hash(open);
     for (auto table = tables_.rbegin(); !open.isNew && table != tables_.rend(); ++table) {
         const std::uint32_t first = table->find(open, hash, edges_->edges());
-        if (first != 0) return {open.letters, first, open.words};
+        if (first != 0) return {first, open.letters, open.words};
     }
     const std::uint32_t first = edges_->append(open.count);
     std::copy_n(open.edges.data(), open.count, edges_->edges() + first);
     if (tables_.back().room == 0) tables_.emplace_back(4 * (tables_.back().last + 1));
     tables_.back().insert({first, open.letters}, hash);
-    return {open.letters, first, open.words};
+    return {first, open.letters, open.words};
 }
 
 namespace {

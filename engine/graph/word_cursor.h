@@ -39,7 +39,7 @@ class WordCursor {
             const Edge& edge = edges[step.edge++];
             const PackedWord word = step.word | PackedLetter(std::countr_zero(step.left), depth_);
             step.left &= step.left - 1;
-            steps_[++depth_] = {edge.first, edge.next(), word};
+            if (edge.next() != 0) steps_[++depth_] = {edge.first, edge.next(), word};
             if (edge.isWord()) return word;
         }
     }

@@ -118,7 +118,7 @@ Edge WordGraph::find(std::string_view letters) const {
             const std::uint32_t bit = LetterBit(letter);
             if ((place.letters & bit) == 0) return Edge{};
             const Edge& edge = edges()[place.at(bit)];
-            place = {edge.letters, edge.first, place.before + edge.before};
+            place = {edge.first, edge.letters, place.before + edge.before};
         }
         return place;
     });

@@ -4,8 +4,8 @@
 // Places 0 to 15 are the cubes. A Qu cube i shows "q" and touches place 16 + i alone, which shows
 // "u", touches the cube's neighbours and is never used up: so each place is one letter, and a word
 // may end in a lone "q".
-#include <array>
-#include <cstdint>
+
+#include "graph/edge_store.h"
 
 namespace Quorle {
 
@@ -29,20 +29,23 @@ inline constexpr auto Around = [] {
     return around;
 }();
 
+/// The fields of an edge as one value, and a fourth one.
+using Fields [[gnu::vector_size(16)]] = std::uint32_t;
+
 /// What a chain that goes on to a place needs to know of it.
-struct alignas(16) Place {
+struct Place {
     std::uint64_t cube;      ///< 0..15
     std::uint32_t below;     ///< the bits of the letters before its own
     std::uint32_t touching;  ///< bit i: place i can follow
-    std::uint32_t kept[4];   ///< what a chain keeps of its edge's fields
+    Fields kept;             ///< what a chain keeps of its head
 };
 
 class BoardPlaces {
   public:
     BoardPlaces() {
         for (std::uint32_t cube = 0; cube < Cubes; ++cube) {
-            places_[cube] = {cube, 0, 0, {0, 0, ~0U, ~(1U << cube)}};
-            places_[Cubes + cube] = {cube, 0, Around[cube], {0, 0, ~0U, ~0U}};
+            places_[cube] = {cube, 0, 0, Fields{0, 0, ~0U, ~(1U << cube)}};
+            places_[Cubes + cube] = {cube, 0, Around[cube], Fields{0, 0, ~0U, ~0U}};
         }
     }
     void show(const Board& board) {
@@ -55,7 +58,7 @@ class BoardPlaces {
     }
     const Place& operator[](std::size_t place) const { return places_[place]; }
 
-    // The letter of each place, as the bit of a byte of a set of letters.
+    // The letter of each place, as the bit of a byte of an edge's first eight.
     alignas(32) std::array<std::uint8_t, Places> byte{};
     alignas(32) std::array<std::uint8_t, Places> bit{};
 
@@ -64,7 +67,7 @@ class BoardPlaces {
 
     void setLetter(std::uint32_t place, std::uint32_t letter) {
         places_[place].below = (1U << letter) - 1;
-        byte[place] = static_cast<std::uint8_t>(letter / 8);
+        byte[place] = static_cast<std::uint8_t>(offsetof(Edge, letters) + letter / 8);
         bit[place] = static_cast<std::uint8_t>(1U << letter % 8);
     }
 

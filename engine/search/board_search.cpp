@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <tuple>
 
 #include "search/letter_match.h"
 
@@ -22,10 +23,21 @@ namespace {
 constexpr std::size_t HardAfter = 16384;
 constexpr int MostEdgesLookedAt = 64;
 
-Fields LoadFields(const void* edge) {
+// What stands behind the edge is read with it and left out.
+Fields LoadFields(const Edge* edge) {
     Fields fields;
     std::memcpy(&fields, edge, sizeof fields);
-    return fields;
+    return fields & Fields{~0U, ~0U, ~0U, 0};
+}
+
+/// One of both, without a branch: the compiler is not to see that a number decides twice, nor what
+/// follows from its choice.
+template <class Value>
+Value Choose(std::uint32_t number, Value whenZero, Value otherwise) {
+    asm("" : "+r"(number));
+    Value chosen = __builtin_expect_with_probability(number == 0, 1, 0.5) ? whenZero : otherwise;
+    asm("" : "+r"(chosen));
+    return chosen;
 }
 
 }  // namespace
@@ -69,7 +81,8 @@ void BoardSearch::runAvx2([[maybe_unused]] const Edge& root) {
 // begins where the one before ends.
 template <class Match>
 inline void BoardSearch::run(const Match& match, const Edge& root) {
-    chains_[0] = {{root.letters, root.first, 0, ~0U}, 0, match(LoadFields(&root)) & AllCubes};
+    const Fields head = {root.first, root.letters, 0, ~0U};
+    chains_[0] = {head, 0, match(head) & AllCubes};
     levels_[0] = {chains_.data(), chains_.data() + (chains_[0].next != 0 ? 1 : 0)};
     std::size_t extended = 0;
     bool isHard = false;
@@ -103,24 +116,23 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
     const auto step = [&](const Chain*& at, std::uint32_t& next) {
         const Chain& from = *at;
         const Place& place = places_[static_cast<std::size_t>(std::countr_zero(next))];
-        const auto before =
-            static_cast<std::size_t>(std::popcount(from.head.letters & place.below));
-        const Fields edge = LoadFields(edges + from.head.first + before);
-        const Fields head = edge + (LoadFields(&from.head) & LoadFields(place.kept));
+        const auto before = static_cast<std::size_t>(std::popcount(from.head[1] & place.below));
+        const Fields edge = LoadFields(edges + from.head[0] + before);
+        const Fields head = edge + (from.head & place.kept);
         const std::uint64_t path = from.path << 4 | place.cube;
-        const std::uint32_t follow = match(edge) & place.touching & from.head.none;
+        const std::uint32_t follow = match(edge) & place.touching & from.head[3];
         word->path = path;
         word->number = head[2];
         word += match.wordEnds(edge);
-        std::memcpy(static_cast<void*>(&to->head), &head, sizeof head);
+        to->head = head;
         to->path = path;
         to->next = follow;
-        // From the sign: of a comparison the compiler would make a branch.
-        to += (0 - std::uint64_t{follow}) >> 63;
+        to = Choose(follow, to, to + 1);
+        __builtin_prefetch(edges + edge[0]);  // comes before the chain's turn
         next &= next - 1;
-        const std::int64_t isDone = (std::int64_t{next} - 1) >> 63;
-        next |= at[1].next & static_cast<std::uint32_t>(isDone);
-        at -= isDone;
+        const std::uint32_t left = next;
+        next = Choose(left, at[1].next, left);
+        at = Choose(left, at + 1, at);
     };
     const Chain* const middle = chain + (end - chain) / 2;
     const Chain* other = middle;
@@ -130,8 +142,9 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
         step(chain, next);
         step(other, otherNext);
     }
-    while (chain != middle) step(chain, next);
-    while (other != end) step(other, otherNext);
+    const Chain* const last = chain == middle ? end : middle;
+    if (chain == middle) std::tie(chain, next) = std::tie(other, otherNext);
+    while (chain != last) step(chain, next);
     if (letters >= limits_.shortest) found_->take(word, static_cast<std::uint32_t>(letters));
     return letters < limits_.longest ? to : begin;
 }
@@ -140,9 +153,9 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
 [[gnu::noinline]] Chain* BoardSearch::thinOut(Chain* begin, Chain* end, std::int32_t letters) {
     return std::remove_if(begin, end, [&](const Chain& chain) {
         int edgesLeft = MostEdgesLookedAt;
-        return allFound(chain.head, chain.head.before, letters, edgesLeft) ||
-               !recent_.add(chain.head.before, static_cast<std::uint64_t>(letters),
-                            chain.head.none & AllCubes, chain.path % Cubes);
+        return allFound({chain.head[0], chain.head[1]}, chain.head[2], letters, edgesLeft) ||
+               !recent_.add(chain.head[2], static_cast<std::uint64_t>(letters),
+                            chain.head[3] & AllCubes, chain.path % Cubes);
     });
 }
 

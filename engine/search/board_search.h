@@ -12,11 +12,10 @@ enum class Matching { Plain, Avx2 };
 /// Whether this machine can do it.
 bool CanMatch(Matching matching);
 
-/// A beginning of words on the board. The cubes still free stand in the edge's field `none`, and
-/// its words before are those of the whole dictionary: so a step is an edge and what a place keeps
-/// of the chain, added up.
+/// A beginning of words on the board. The words before its edge are those of the whole dictionary:
+/// so a step is an edge and what a place keeps of the chain, added up.
 struct Chain {
-    Edge head;
+    Fields head;         // the edge it stands on, and the cubes still free
     std::uint64_t path;  // as of a FoundWord
     std::uint32_t next;  // bit i: the chain can go on with place i
 };

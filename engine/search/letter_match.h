@@ -11,9 +11,6 @@
 
 namespace Quorle {
 
-/// The four fields of an edge as one value.
-using Fields [[gnu::vector_size(16)]] = std::uint32_t;
-
 /// By tables: the places of all sets of nine letters.
 class PlainMatch {
   public:
@@ -30,12 +27,12 @@ class PlainMatch {
     }
     /// Bit i: place i shows one of the letters that follow.
     std::uint32_t operator()(Fields edge) const {
-        const std::uint32_t letters = edge[0];
+        const std::uint32_t letters = edge[1];
         return tables_[0][letters % 512] | tables_[1][letters >> 9 & 511] |
                tables_[2][letters >> 18 & 511];
     }
     /// 1 when a word ends with the edge, else 0.
-    static std::uint32_t wordEnds(Fields edge) { return edge[0] >> 31; }
+    static std::uint32_t wordEnds(Fields edge) { return edge[1] >> 31; }
 
   private:
     std::array<std::array<std::uint32_t, 512>, 4> tables_{};  // the last one of no letter
@@ -51,14 +48,14 @@ class Avx2Match {
         bit_ = _mm256_load_si256(reinterpret_cast<const __m256i*>(places.bit.data()));
     }
     [[gnu::target("avx2")]] std::uint32_t operator()(Fields edge) const {
-        const __m256i all = _mm256_broadcastd_epi32(reinterpret_cast<__m128i>(edge));
+        const __m256i all = _mm256_broadcastq_epi64(reinterpret_cast<__m128i>(edge));
         const __m256i own = _mm256_and_si256(_mm256_shuffle_epi8(all, byte_), bit_);
         return static_cast<std::uint32_t>(_mm256_movemask_epi8(_mm256_cmpeq_epi8(own, bit_)));
     }
 
-    /// By the signs of all fields: no other one has any.
+    /// By the signs of both halves: the other one has none.
     static std::uint32_t wordEnds(Fields edge) {
-        return static_cast<std::uint32_t>(_mm_movemask_ps(reinterpret_cast<__m128>(edge)));
+        return static_cast<std::uint32_t>(_mm_movemask_pd(reinterpret_cast<__m128d>(edge)));
     }
 
   private:
