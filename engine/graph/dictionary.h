@@ -21,15 +21,18 @@ class Dictionary {
     void replace(WordGraph words) {
         words_ = std::move(words);
         for (char first = 'a'; first <= 'z'; ++first) {
-            for (char second = 'a'; second <= 'z'; ++second) renew(first, second);
+            for (char second = 'a'; second <= 'z'; ++second) {
+                const char both[] = {first, second};
+                beginnings_[beginningOf(both)] = words_.find({both, 2});
+            }
         }
     }
     /// Adds a word of 2 to 16 letters, or removes it; false when it is held, or not, already.
     /// Throws std::bad_alloc and changes nothing.
     bool set(const char* word, bool isHeld) {
         if ((lookUp(word) >= WordEnds) == isHeld) return false;
-        words_.set(word, isHeld);
-        renew(word[0], word[1]);
+        // An edit changes where the edges on its path lead, and no others'.
+        beginnings_[beginningOf(word)] = words_.set(word, isHeld);
         return true;
     }
 
@@ -41,7 +44,7 @@ class Dictionary {
             const Edge* const edges = words_.edges();
             const Edge* edge = &words_.root();
             if (numberOf(at[0]) < Letters && numberOf(at[1]) < Letters) {
-                edge = &beginnings_[numberOf(at[0]) * Letters + numberOf(at[1])];
+                edge = &beginnings_[beginningOf(at)];
                 at += 2;
             }
             for (; *at != 0; ++at) {
@@ -55,11 +58,8 @@ class Dictionary {
 
   private:
     static std::uint32_t numberOf(char letter) { return static_cast<std::uint32_t>(letter - 'a'); }
-
-    // An edit changes where the edges on its path lead, and no others'.
-    void renew(char first, char second) {
-        const char both[] = {first, second};
-        beginnings_[numberOf(first) * Letters + numberOf(second)] = words_.find({both, 2});
+    static std::uint32_t beginningOf(const char* word) {
+        return numberOf(word[0]) * Letters + numberOf(word[1]);
     }
 
     WordGraph words_;

@@ -82,6 +82,7 @@ bool GraphBuilder::giveBack() {
 // Stores the nodes of the last word below `depth` letters, deepest first, and leads to them.
 void GraphBuilder::closeNodes(std::size_t depth) {
     for (; depth_ > depth; --depth_) {
+        if (path_[depth_].letters == 0) continue;
         const std::size_t size = edges_->size();
         path_[depth_ - 1].lead(store(path_[depth_]));
         if (edges_->size() > size) path_[depth_ - 1].isNew = true;

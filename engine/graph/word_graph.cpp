@@ -30,7 +30,7 @@ class Edit {
 
     // Down the path nodes are copied, and the words behind it counted anew, by one more or less; up
     // again the edges are left out that lead nowhere, and nodes that the base has as well.
-    void toggle(Edge& root, std::string_view word, std::uint32_t change) {
+    Edge toggle(Edge& root, std::string_view word, std::uint32_t change) {
         std::array<Step, LongestWord + 1> path;
         Step* step = path.data();
         *step = {&root, edges_};
@@ -52,6 +52,7 @@ class Edit {
             if (goOn) leaveOut(*step->edge, LetterBit(word[depth]));
             if (depth >= KeptDepth && joinBase(*step->edge, *step->base)) goOn = true;
         }
+        return *path[2].edge;
     }
 
   private:
@@ -125,8 +126,8 @@ Edge WordGraph::find(std::string_view letters) const {
 }
 
 // All memory that an edit can need is asked for before it begins, so that it cannot fail halfway.
-void WordGraph::set(std::string_view word, bool isHeld) {
-    assert(!word.empty() && word.size() <= LongestWord && find(word).isWord() != isHeld);
+Edge WordGraph::set(std::string_view word, bool isHeld) {
+    assert(word.size() >= 2 && word.size() <= LongestWord && find(word).isWord() != isHeld);
     if (place_.use_count() != 1) {
         place_.reset(new Place{place_ ? place_->store : std::make_shared<EdgeStore>(), root()});
         place_->store->hold(root());
@@ -134,8 +135,8 @@ void WordGraph::set(std::string_view word, bool isHeld) {
     EdgeStore& store = *place_->store;
     store.reserve(MostEditedEdges);
     const std::uint32_t change = isHeld ? 1 : ~0U;
-    CountingBits([&] { Edit(store).toggle(place_->root, word, change); });
     size_ += change;
+    return CountingBits([&] { return Edit(store).toggle(place_->root, word, change); });
 }
 
 }  // namespace Quorle

@@ -1,7 +1,7 @@
 #pragma once
 // A set of words as a word graph: words that begin alike share edges, and so do words that end
 // alike. A WordGraph is a snapshot: copying it is cheap, and an edit changes this copy alone.
-// Words are 1 to 16 letters "a" to "z"; whoever calls has checked that.
+// Words are 2 to 16 letters "a" to "z"; whoever calls has checked that.
 #include <memory>
 #include <string_view>
 
@@ -21,8 +21,8 @@ class WordGraph {
     Edge find(std::string_view letters) const;
 
     /// Adds a word that is not held, or removes one that is. Copies only the nodes on its path.
-    /// Throws std::bad_alloc and changes nothing.
-    void set(std::string_view word, bool isHeld);
+    /// Tells where its first two letters lead now. Throws std::bad_alloc and changes nothing.
+    Edge set(std::string_view word, bool isHeld);
 
     /// Whether no smaller graph spells the same words: true until an edit.
     bool isMinimal() const { return root() == edges()[0]; }
