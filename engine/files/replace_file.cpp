@@ -160,8 +160,4 @@ bool ReplaceFile(const FileTarget& target, std::span<const std::byte> content, O
     return replacement.takePlace() && (Sync(folder) || errno == EINVAL);
 }
 
-bool ReplaceFile(const char* path, std::span<const std::byte> content, Old old) {
-    return ReplaceFile(LockTarget(path), content, old);
-}
-
 }  // namespace Quorle

@@ -27,6 +27,5 @@ enum class Old { Goes, Stays };
 /// mode and, where allowed, owner stay. Only a regular file is replaced. False: the old content
 /// stands (or the new, when only the folder's sync failed).
 bool ReplaceFile(const FileTarget& target, std::span<const std::byte> content, Old old = Old::Goes);
-bool ReplaceFile(const char* path, std::span<const std::byte> content, Old old = Old::Goes);
 
 }  // namespace Quorle

@@ -66,10 +66,7 @@ std::uint32_t CountWords(const Edge* edges, const Edge& edge);
 /// its end; edited nodes that nothing leads to are used again.
 class EdgeStore {
   public:
-    EdgeStore() {
-        append(1);
-        edges_[0] = {};
-    }
+    EdgeStore() { edges_[append(1)] = {}; }
 
     Edge* edges() { return edges_.get(); }
     std::size_t size() const { return size_; }

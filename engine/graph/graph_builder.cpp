@@ -127,9 +127,10 @@ class Copier {
             if (whole.letters == 0) whole = copyEdges(to, letters);
             return whole;
         }
-        const auto [cut, isNew] = cut_.try_emplace(std::uint64_t{to.first} << 8 | letters);
-        if (isNew) cut->second = copyEdges(to, letters);
-        return cut->second;
+        const auto [at, isNew] = cut_.try_emplace(std::uint64_t{to.first} << 8 | letters);
+        Edge& cut = at->second;  // stays there while more are added
+        if (isNew) cut = copyEdges(to, letters);
+        return cut;
     }
 
     Edge copyEdges(const Edge& to, std::size_t letters) {

@@ -81,7 +81,7 @@ bool LoadDictionary(const char* path) {
 bool Save(const char* path, std::span<const std::byte> content) {
     const std::string place = PathWithoutLinks(path);
     const bool stays = State.unreadable.contains(place);
-    if (!ReplaceFile(path, content, stays ? Old::Stays : Old::Goes)) return false;
+    if (!ReplaceFile(LockTarget(path), content, stays ? Old::Stays : Old::Goes)) return false;
     State.unreadable.erase(place);
     return true;
 }
@@ -96,14 +96,6 @@ std::string WordsAsText(const WordGraph& words) {
         text.append(letters, LengthOf(word)).push_back('\n');
     }
     return text;
-}
-
-void SearchBoard(std::string_view letters) {
-    Board board;
-    std::copy(letters.begin(), letters.end(), board.begin());
-    if (!State.search) State.search = std::make_unique<BoardSearch>();
-    const Dictionary& dictionary = State.dictionary;
-    State.search->search(dictionary.words(), board, dictionary.limits, State.found);
 }
 
 }  // namespace
@@ -190,9 +182,13 @@ int32_t cWriteTextFile(const char* path) {
 
 int32_t cCheckForAllDefinedWords(const char* board) {
     const bool isFound = Guarded(false, [&] {
-        const bool isBoard = Word(board).size() == Cubes;
-        if (isBoard) SearchBoard(Word(board));
-        return isBoard;
+        Board letters;
+        if (Word(board).size() != letters.size()) return false;
+        std::copy_n(board, letters.size(), letters.begin());
+        if (!State.search) State.search = std::make_unique<BoardSearch>();
+        const Dictionary& dictionary = State.dictionary;
+        State.search->search(dictionary.words(), letters, dictionary.limits, State.found);
+        return true;
     });
     if (!isFound) State.found.clear();
     return static_cast<int32_t>(State.found.size());

@@ -2,8 +2,8 @@
 // A board of 4 by 4 letter cubes, as places that chains go along.
 //
 // Places 0 to 15 are the cubes. A Qu cube i shows "q" and touches place 16 + i alone, which shows
-// "u", touches the cube's neighbours and is never used up: so each place is one letter, and a word
-// may end in a lone "q".
+// "u" and touches the cube's neighbours: so each place is one letter, and a word may end in a lone
+// "q".
 
 #include "graph/edge_store.h"
 
@@ -43,10 +43,8 @@ struct Place {
 class BoardPlaces {
   public:
     BoardPlaces() {
-        for (std::uint32_t cube = 0; cube < Cubes; ++cube) {
-            places_[cube] = {cube, 0, 0, Fields{0, 0, ~0U, ~(1U << cube)}};
-            places_[Cubes + cube] = {cube, 0, Around[cube], Fields{0, 0, ~0U, ~0U}};
-        }
+        for (std::uint32_t i = 0; i < Places; ++i)
+            places_[i] = {i % Cubes, 0, Around[i % Cubes], Fields{0, 0, ~0U, ~(1U << i)}};
     }
     void show(const Board& board) {
         for (std::uint32_t cube = 0; cube < Cubes; ++cube) {

@@ -59,7 +59,6 @@ BoardSearch::BoardSearch(Matching matching) : matching_(matching) {
 void BoardSearch::search(const WordGraph& graph, const Board& board, WordLimits limits,
                          FoundWords& found) {
     found.begin(graph.size(), board);
-    if (limits.shortest > limits.longest) return;
     places_.show(board);
     edges_ = graph.edges();
     found_ = &found;
