@@ -63,7 +63,7 @@ class Dictionary {
     }
 
     WordGraph words_;
-    // The edges of all beginnings of two letters: two steps less.
+    // Where all beginnings of two letters lead: two steps less. Words before are not kept up.
     std::array<Edge, std::size_t{Letters} * Letters> beginnings_{};
 };
 

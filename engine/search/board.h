@@ -4,7 +4,6 @@
 // Places 0 to 15 are the cubes. A Qu cube i shows "q" and touches place 16 + i alone, which shows
 // "u" and touches the cube's neighbours: so each place is one letter, and a word may end in a lone
 // "q".
-
 #include "graph/edge_store.h"
 
 namespace Quorle {
@@ -29,8 +28,9 @@ inline constexpr auto Around = [] {
     return around;
 }();
 
-/// The fields of an edge as one value, and a fourth one.
+/// The fields of an edge as one value, and a fourth: the places that a chain has not gone along.
 using Fields [[gnu::vector_size(16)]] = std::uint32_t;
+inline constexpr int First = 0, Mask = 1, Before = 2, Free = 3;
 
 /// What a chain that goes on to a place needs to know of it.
 struct Place {

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cstring>
-#include <tuple>
 
 #include "search/letter_match.h"
 
@@ -23,21 +22,22 @@ namespace {
 constexpr std::size_t HardAfter = 16384;
 constexpr int MostEdgesLookedAt = 64;
 
-// What stands behind the edge is read with it and left out.
+// What stands behind the edge is read with it, and left out.
 Fields LoadFields(const Edge* edge) {
     Fields fields;
     std::memcpy(&fields, edge, sizeof fields);
     return fields & Fields{~0U, ~0U, ~0U, 0};
 }
 
-/// One of both, without a branch: the compiler is not to see that a number decides twice, nor what
-/// follows from its choice.
+/// One of both, without the branch that compilers would make of it.
 template <class Value>
 Value Choose(std::uint32_t number, Value whenZero, Value otherwise) {
-    asm("" : "+r"(number));
-    Value chosen = __builtin_expect_with_probability(number == 0, 1, 0.5) ? whenZero : otherwise;
-    asm("" : "+r"(chosen));
-    return chosen;
+#if defined(__x86_64__)
+    asm("test %1, %1\n\tcmovz %2, %0" : "+r"(otherwise) : "r"(number), "rm"(whenZero) : "cc");
+    return otherwise;
+#else
+    return number == 0 ? whenZero : otherwise;
+#endif
 }
 
 }  // namespace
@@ -115,19 +115,19 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
     const auto step = [&](const Chain*& at, std::uint32_t& next) {
         const Chain& from = *at;
         const Place& place = places_[static_cast<std::size_t>(std::countr_zero(next))];
-        const auto before = static_cast<std::size_t>(std::popcount(from.head[1] & place.below));
-        const Fields edge = LoadFields(edges + from.head[0] + before);
+        const auto before = static_cast<std::size_t>(std::popcount(from.head[Mask] & place.below));
+        const Fields edge = LoadFields(edges + from.head[First] + before);
         const Fields head = edge + (from.head & place.kept);
         const std::uint64_t path = from.path << 4 | place.cube;
-        const std::uint32_t follow = match(edge) & place.touching & from.head[3];
+        const std::uint32_t follow = match(edge) & place.touching & from.head[Free];
         word->path = path;
-        word->number = head[2];
+        word->number = head[Before];
         word += match.wordEnds(edge);
         to->head = head;
         to->path = path;
         to->next = follow;
         to = Choose(follow, to, to + 1);
-        __builtin_prefetch(edges + edge[0]);  // comes before the chain's turn
+        __builtin_prefetch(edges + edge[First]);  // comes before the chain's turn
         next &= next - 1;
         const std::uint32_t left = next;
         next = Choose(left, at[1].next, left);
@@ -141,9 +141,8 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
         step(chain, next);
         step(other, otherNext);
     }
-    const Chain* const last = chain == middle ? end : middle;
-    if (chain == middle) std::tie(chain, next) = std::tie(other, otherNext);
-    while (chain != last) step(chain, next);
+    while (chain != middle) step(chain, next);
+    while (other != end) step(other, otherNext);
     if (letters >= limits_.shortest) found_->take(word, static_cast<std::uint32_t>(letters));
     return letters < limits_.longest ? to : begin;
 }
@@ -151,10 +150,11 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
 /// Drops the chains that need not be extended, and returns the new end.
 [[gnu::noinline]] Chain* BoardSearch::thinOut(Chain* begin, Chain* end, std::int32_t letters) {
     return std::remove_if(begin, end, [&](const Chain& chain) {
+        const Fields& head = chain.head;
         int edgesLeft = MostEdgesLookedAt;
-        return allFound({chain.head[0], chain.head[1]}, chain.head[2], letters, edgesLeft) ||
-               !recent_.add(chain.head[2], static_cast<std::uint64_t>(letters),
-                            chain.head[3] & AllCubes, chain.path % Cubes);
+        return allFound({head[First], head[Mask]}, head[Before], letters, edgesLeft) ||
+               !recent_.add(head[Before], static_cast<std::uint64_t>(letters),
+                            head[Free] & AllCubes, chain.path % Cubes);
     });
 }
 

@@ -15,7 +15,7 @@ bool CanMatch(Matching matching);
 /// A beginning of words on the board. The words before its edge are those of the whole dictionary:
 /// so a step is an edge and what a place keeps of the chain, added up.
 struct Chain {
-    Fields head;         // the edge it stands on, and the cubes still free
+    Fields head;         // the edge it stands on
     std::uint64_t path;  // as of a FoundWord
     std::uint32_t next;  // bit i: the chain can go on with place i
 };

@@ -27,12 +27,12 @@ class PlainMatch {
     }
     /// Bit i: place i shows one of the letters that follow.
     std::uint32_t operator()(Fields edge) const {
-        const std::uint32_t letters = edge[1];
+        const std::uint32_t letters = edge[Mask];
         return tables_[0][letters % 512] | tables_[1][letters >> 9 & 511] |
                tables_[2][letters >> 18 & 511];
     }
     /// 1 when a word ends with the edge, else 0.
-    static std::uint32_t wordEnds(Fields edge) { return edge[1] >> 31; }
+    static std::uint32_t wordEnds(Fields edge) { return edge[Mask] >> 31; }
 
   private:
     std::array<std::array<std::uint32_t, 512>, 4> tables_{};  // the last one of no letter
