@@ -46,7 +46,7 @@ class Boards {
 };
 
 void AddSearches(const Row& row, const std::vector<std::string>& boards,
-                 const std::string& dictionary, std::shared_ptr<UsualWay> usual, bool fetch,
+                 const std::string& dictionary, const std::shared_ptr<UsualWay>& usual, bool fetch,
                  int calls = 0) {
     cReadBinaryDictionary(dictionary.c_str());
     for (std::size_t i = 0; i < std::min<std::size_t>(boards.size(), 500); ++i) {

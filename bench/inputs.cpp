@@ -48,8 +48,8 @@ WordList Runs() {
 }
 
 std::string TempFile(const std::string& name) {
-    static const TempFolder Folder;
-    return Folder.path / name;
+    static const TempFolder folder;
+    return folder.path / name;
 }
 
 void WriteText(const std::string& path, const WordList& words) {
@@ -62,7 +62,7 @@ std::size_t FileSize(const std::string& path) {
 }
 
 std::string DictionaryOf(const std::string& name, const WordList& words) {
-    const std::string path = TempFile(name + ".dat");
+    std::string path = TempFile(name + ".dat");
     if (std::filesystem::exists(path)) return path;
     WriteText(TempFile(name + ".txt"), words);
     cDictionaryClear();

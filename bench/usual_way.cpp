@@ -47,7 +47,8 @@ void UsualWay::visit(const Node* node, int cube, const std::string& board) {
     const int column = cube % 4;
     for (int r = std::max(row - 1, 0); r <= std::min(row + 1, 3); ++r) {
         for (int c = std::max(column - 1, 0); c <= std::min(column + 1, 3); ++c) {
-            if (!used_[static_cast<std::size_t>(4 * r + c)]) follow(node, 4 * r + c, board);
+            const int other = 4 * r + c;
+            if (!used_[static_cast<std::size_t>(other)]) follow(node, other, board);
         }
     }
     used_[static_cast<std::size_t>(cube)] = false;

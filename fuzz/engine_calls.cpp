@@ -23,13 +23,13 @@ std::string Word() {
     const int shape = Number();
     std::string text(static_cast<std::size_t>(shape % 19), 'a');
     for (char& c : text) c = shape >= 240 ? static_cast<char>(Number()) : "aquc"[Number() % 4];
-    return text.c_str();
+    return text.substr(0, text.find('\0'));
 }
 
 /// As many bytes as the next two say.
 std::string Bytes() {
     const std::ptrdiff_t low = Number(), size = low + 256 * Number();
-    const std::string bytes(At, At + std::min(size, End - At));
+    std::string bytes(At, At + std::min(size, End - At));
     At += bytes.size();
     return bytes;
 }
