@@ -16,11 +16,13 @@ class Merging : public OpenEditor {
         Platform::ChooseFileToOpen = [path = folder_ / name](const auto&) { return path; };
         menu("DictionaryEditor/Merge");
     }
-    /// Merges different words with one beginning, too many for a single step.
+    /// Merges different words with one beginning, of which few end alike: too many for some steps.
     void mergeMany(char beginning) {
         std::string words;
-        for (int i = 0; i < ManyWords; ++i)
-            words += beginning + std::to_string(ManyWords + i) + "\n";
+        for (int i = 0; i < ManyWords; ++i) {
+            const std::string number = std::to_string(ManyWords + i);
+            words += beginning + number + std::string(number.rbegin(), number.rend()) + "\n";
+        }
         for (char& each : words) {
             if (std::isdigit(each) != 0) each = static_cast<char>(each - '0' + 'a');
         }
