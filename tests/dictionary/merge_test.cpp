@@ -16,7 +16,7 @@ class Merging : public OpenEditor {
         Platform::ChooseFileToOpen = [path = folder_ / name](const auto&) { return path; };
         menu("DictionaryEditor/Merge");
     }
-    /// Merges different words with one beginning, of which few end alike: too many for some steps.
+    /// Merges different words with one beginning. Few end alike, so that it takes many steps.
     void mergeMany(char beginning) {
         std::string words;
         for (int i = 0; i < ManyWords; ++i) {
