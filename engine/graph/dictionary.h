@@ -20,11 +20,9 @@ class Dictionary {
     const WordGraph& words() const { return words_; }
     void replace(WordGraph words) {
         words_ = std::move(words);
-        for (char first = 'a'; first <= 'z'; ++first) {
-            for (char second = 'a'; second <= 'z'; ++second) {
-                const char both[] = {first, second};
-                beginnings_[beginningOf(both)] = words_.find({both, 2});
-            }
+        for (std::uint32_t i = 0; i < beginnings_.size(); ++i) {
+            const Edge& first = Follow(words_.edges(), words_.root(), 1U << i / Letters);
+            beginnings_[i] = Follow(words_.edges(), first, 1U << i % Letters);
         }
     }
     /// Adds a word of 2 to 16 letters, or removes it; false when it is held, or not, already.

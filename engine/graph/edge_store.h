@@ -36,6 +36,11 @@ struct Edge {
 
 inline constexpr Edge Nowhere;
 
+/// Where a letter leads; Nowhere when no word goes on with it.
+inline const Edge& Follow(const Edge* edges, const Edge& from, std::uint32_t bit) {
+    return (from.letters & bit) != 0 ? edges[from.at(bit)] : Nowhere;
+}
+
 /// The bit of a lower-case letter.
 inline std::uint32_t LetterBit(char letter) {
     assert(letter >= 'a' && letter <= 'z');

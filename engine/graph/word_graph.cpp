@@ -40,8 +40,8 @@ class Edit {
             Edge* const edge = edges_ + step->edge->at(bit);
             Edge* const end = edges_ + step->edge->first + step->edge->count();
             for (Edge* later = edge + 1; later < end; ++later) later->before += change;
-            const Edge& base = *step->base;
-            *++step = {edge, (base.letters & bit) != 0 ? edges_ + base.at(bit) : &Nowhere};
+            const Edge& base = Follow(edges_, *step->base, bit);
+            *++step = {edge, &base};
         }
         step->edge->letters ^= WordEnds;
         step->edge->before += change;
@@ -116,9 +116,7 @@ Edge WordGraph::find(std::string_view letters) const {
     return CountingBits([&] {
         Edge place = root();
         for (const char letter : letters) {
-            const std::uint32_t bit = LetterBit(letter);
-            if ((place.letters & bit) == 0) return Edge{};
-            const Edge& edge = edges()[place.at(bit)];
+            const Edge& edge = Follow(edges(), place, LetterBit(letter));
             place = {edge.first, edge.letters, place.before + edge.before};
         }
         return place;
