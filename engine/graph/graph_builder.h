@@ -2,6 +2,7 @@
 // Building minimal graphs: of sorted words in one pass, or of another graph.
 #include <array>
 #include <memory>
+#include <span>
 #include <vector>
 
 #include "graph/memory.h"
@@ -9,37 +10,6 @@
 #include "graph/word_graph.h"
 
 namespace Quorle {
-
-/// A node that is still open for more letters.
-struct OpenNode {
-    std::uint32_t letters = 0;
-    std::uint32_t count = 0;
-    std::uint32_t words = 0;
-    bool isNew = false;  // as is known of what leads to a new node
-    std::array<Edge, Letters> edges;
-
-    void clear() {
-        letters = count = words = 0;
-        isNew = false;
-    }
-    /// `bit`: of a letter after all that are there.
-    void open(std::uint32_t bit) {
-        assert(letters < bit);
-        letters |= bit;
-        edges[count++] = {0, 0, words};
-    }
-    /// A word ends with the last letter.
-    void endWord() {
-        edges[count - 1].letters |= WordEnds;
-        edges[count - 1].before = ++words;
-    }
-    /// The last letter leads to a stored node.
-    void lead(const Edge& node) {
-        edges[count - 1].letters |= node.letters;
-        edges[count - 1].first = node.first;
-        words += node.before;
-    }
-};
 
 /// Takes words in strictly ascending order, one by one, each in bounded time; so is finishing.
 class GraphBuilder {
@@ -54,9 +24,9 @@ class GraphBuilder {
     /// Then: gives some memory back, for all at once takes long; false when there is no more.
     bool giveBack();
 
-    /// Instead of words, nodes can be stored one by one, children first. Gives what an edge says
-    /// of the node, and as its words before those that go on from it.
-    Edge store(const OpenNode& open);
+    /// Instead of words, nodes can be stored one by one, children first: by the edges of these
+    /// letters. Gives the index of the first edge; 0 for no edges.
+    std::uint32_t store(std::span<const Edge> node, std::uint32_t letters);
     /// The graph of a node stored, or of none.
     WordGraph finish(const Edge& root);
 
@@ -68,19 +38,34 @@ class GraphBuilder {
     };
     struct Table {
         explicit Table(std::size_t slots);
-        std::uint32_t find(const OpenNode& open, std::uint64_t hash, const Edge* edges) const;
-        void insert(Slot slot, std::uint64_t hash);
         Memory<Slot> slots;
         std::size_t last;
         std::size_t room;
     };
+    static constexpr std::uint32_t WordsAtOnce = 256;
+    /// The edges with as many letters before their ends that are not stored yet, in order. They
+    /// count all words before them until they are stored.
+    struct Level {
+        std::array<Edge, WordsAtOnce + Letters> edges;
+        std::size_t count = 0;
+    };
+    /// To be stored.
+    struct Node {
+        Edge* parent;  // the edge that leads to it
+        std::span<Edge> edges;
+        std::uint32_t hash;
+    };
 
-    void closeNodes(std::size_t depth);
+    std::span<Node> closedNodes(std::size_t depth);
+    void storeClosedNodes();
+    std::uint32_t store(std::span<const Edge> node, std::uint32_t letters, std::uint32_t hash);
 
     std::shared_ptr<EdgeStore> edges_;
-    std::array<OpenNode, LongestWord + 1> path_;
+    std::array<Level, LongestWord + 1> levels_{};  // the first one: of the root's edge
+    std::array<Node, WordsAtOnce + 1> nodes_;
     PackedWord last_ = 0;
-    std::size_t depth_ = 0;  // letters of the last word
+    std::size_t open_ = 0;  // levels with a node that letters can still come to
+    std::uint32_t words_ = 0;
     // When a table is full a larger one is begun, and both are looked at: moving one takes long.
     std::vector<Table> tables_;
 };

@@ -22,9 +22,9 @@ inline PackedWord PackedLetter(int letter, std::size_t place) {
     return PackedWord{static_cast<unsigned>('a' + letter)} << 8 * (LongestWord - 1 - place);
 }
 
-/// The letter (0 "a" .. 25 "z") at a place of the word.
-inline unsigned LetterAt(PackedWord word, std::size_t place) {
-    return static_cast<unsigned>(word >> 8 * (LongestWord - 1 - place)) % 32 - 1;
+/// The first letter (0 "a" .. 25 "z") of the word.
+inline unsigned FirstLetter(PackedWord word) {
+    return static_cast<unsigned>(word >> 8 * (LongestWord - 1)) % 32 - 1;
 }
 
 /// The number of letters, 1..16.
