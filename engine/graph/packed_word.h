@@ -59,26 +59,23 @@ inline PackedWord LoadBytes(const std::byte* text) {
     return PackedWord{__builtin_bswap64(halves[0])} << 64 | __builtin_bswap64(halves[1]);
 }
 
-/// Writes the word's letters, 2 to 16, and nothing behind them: by both ends, which may overlap.
+inline constexpr std::uint64_t WordAndBehind[] = {0, 0, ~std::uint64_t{0}, ~std::uint64_t{0}};
+/// 16 bytes that mark those behind a word of so many letters.
+inline const char* BehindWord(std::size_t length) {
+    return reinterpret_cast<const char*>(WordAndBehind) + LongestWord - length;
+}
+
+/// Writes the word's letters, `length` of them, into a buffer of 16. What stands behind them there
+/// is written again as it is, so that no branch depends on the length.
 inline void WriteLetters(PackedWord word, std::size_t length, char* to) {
     static_assert(std::endian::native == std::endian::little);
-    const auto write = [to, length](auto first, auto last) {
-        std::memcpy(to, &first, sizeof first);
-        std::memcpy(to + length - sizeof last, &last, sizeof last);
-    };
-    const auto high = static_cast<std::uint64_t>(word >> 64);
-    if (length > 8) {
-        const auto end = static_cast<std::uint64_t>(word >> 8 * (LongestWord - length));
-        return write(__builtin_bswap64(high), __builtin_bswap64(end));
-    }
-    const std::uint64_t end = high >> 8 * (8 - length);
-    if (length >= 4) {
-        write(__builtin_bswap32(static_cast<std::uint32_t>(high >> 32)),
-              __builtin_bswap32(static_cast<std::uint32_t>(end)));
-    } else if (length >= 2) {
-        write(__builtin_bswap16(static_cast<std::uint16_t>(high >> 48)),
-              __builtin_bswap16(static_cast<std::uint16_t>(end)));
-    }
+    std::uint64_t halves[2];
+    std::uint64_t behind[2];
+    std::memcpy(halves, to, sizeof halves);
+    std::memcpy(behind, BehindWord(length), sizeof behind);
+    halves[0] = (halves[0] & behind[0]) | __builtin_bswap64(static_cast<std::uint64_t>(word >> 64));
+    halves[1] = (halves[1] & behind[1]) | __builtin_bswap64(static_cast<std::uint64_t>(word));
+    std::memcpy(to, halves, sizeof halves);
 }
 
 }  // namespace Quorle
