@@ -6,6 +6,10 @@
 // "q".
 #include "graph/edge_store.h"
 
+#if defined(__x86_64__)
+#include <immintrin.h>
+#endif
+
 namespace Quorle {
 
 inline constexpr std::uint32_t Cubes = 16;
@@ -43,15 +47,15 @@ struct Place {
 class BoardPlaces {
   public:
     BoardPlaces() {
-        for (std::uint32_t i = 0; i < Places; ++i)
+        for (std::uint32_t i = 0; i < Places; ++i) {
             places_[i] = {i % Cubes, 0, Around[i % Cubes], Fields{0, 0, ~0U, ~(1U << i)}};
+            setLetter(i, 'u');  // of a place behind the cubes: for good
+        }
     }
     void show(const Board& board) {
         for (std::uint32_t cube = 0; cube < Cubes; ++cube) {
-            const bool isQu = board[cube] == 'q';
-            setLetter(cube, static_cast<std::uint32_t>(board[cube] - 'a'));
-            setLetter(Cubes + cube, isQu ? 'u' - 'a' : NoLetter);
-            places_[cube].touching = isQu ? 1U << (Cubes + cube) : Around[cube];
+            setLetter(cube, board[cube]);
+            places_[cube].touching = board[cube] == 'q' ? 1U << (Cubes + cube) : Around[cube];
         }
     }
     const Place& operator[](std::size_t place) const { return places_[place]; }
@@ -61,9 +65,8 @@ class BoardPlaces {
     alignas(32) std::array<std::uint8_t, Places> bit{};
 
   private:
-    static constexpr std::uint32_t NoLetter = 30;  // in no edge
-
-    void setLetter(std::uint32_t place, std::uint32_t letter) {
+    void setLetter(std::uint32_t place, char shown) {
+        const auto letter = static_cast<std::uint32_t>(shown - 'a');
         places_[place].below = (1U << letter) - 1;
         byte[place] = static_cast<std::uint8_t>(offsetof(Edge, letters) + letter / 8);
         bit[place] = static_cast<std::uint8_t>(1U << letter % 8);

@@ -58,7 +58,7 @@ BoardSearch::BoardSearch(Matching matching) : matching_(matching) {
 
 void BoardSearch::search(const WordGraph& graph, const Board& board, WordLimits limits,
                          FoundWords& found) {
-    found.begin(graph.size(), board);
+    found.begin(graph.size(), board, matching_ == Matching::Avx2);
     places_.show(board);
     edges_ = graph.edges();
     found_ = &found;

@@ -6,6 +6,30 @@
 
 namespace Quorle {
 
+namespace {
+
+#if defined(__x86_64__)
+// The letters by one shuffle of the board; a cube twice in a row is the Qu cube. What stands behind
+// the word in the buffer is written again as it is.
+[[gnu::target("avx2")]] std::size_t SpellAvx2(const FoundWord& word, const Board& board, char* to) {
+    const auto load = [](const char* from) {
+        return _mm_loadu_si128(reinterpret_cast<const __m128i*>(from));
+    };
+    const std::uint64_t path = __builtin_bswap64(word.path << 4 * (LongestWord - word.letters));
+    const __m128i pairs = _mm_cvtsi64_si128(static_cast<std::int64_t>(path));
+    const __m128i cubes =
+        _mm_and_si128(_mm_unpacklo_epi8(_mm_srli_epi64(pairs, 4), pairs), _mm_set1_epi8(15));
+    const __m128i before = _mm_or_si128(_mm_slli_si128(cubes, 1), _mm_cvtsi32_si128(Cubes));
+    const __m128i spelled = _mm_blendv_epi8(_mm_shuffle_epi8(load(board.data()), cubes),
+                                            _mm_set1_epi8('u'), _mm_cmpeq_epi8(cubes, before));
+    _mm_storeu_si128(reinterpret_cast<__m128i*>(to),
+                     _mm_blendv_epi8(spelled, load(to), load(BehindWord(word.letters))));
+    return word.letters;
+}
+#endif
+
+}  // namespace
+
 // A quarter of a million numbers have three digits of few values, or two of many to add up.
 constexpr std::size_t FewWords = 20;
 constexpr unsigned FewBits = 6;
@@ -18,17 +42,11 @@ void FoundWords::clear() {
     isFinished_ = false;
 }
 
-void FoundWords::begin(std::size_t dictionary, const Board& board) {
+void FoundWords::begin(std::size_t dictionary, const Board& board, bool hasAvx2) {
     clear();
     board_ = board;
-    if (dictionary < knownSize_) return;
-    known_ = TakeZeroed<std::uint64_t>(dictionary / 64 + 1);
-    knownSize_ = dictionary + 1;
-}
-
-FoundWord* FoundWords::room(std::size_t most) {
-    if (words_.size() < size_ + most) words_.resize(2 * size_ + most);
-    return words_.data() + size_;
+    hasAvx2_ = hasAvx2;
+    if (known_.size() <= dictionary / 64) known_.resize(dictionary / 64 + 1);
 }
 
 void FoundWords::take(const FoundWord* end, std::uint32_t letters) {
@@ -50,7 +68,7 @@ template <unsigned DigitBits>
 void FoundWords::sortByDigits() {
     constexpr std::uint32_t Digits = 1U << DigitBits;
     sorted_.resize(words_.size());
-    for (unsigned shift = 0; knownSize_ >> shift != 0; shift += DigitBits) {
+    for (unsigned shift = 0; 64 * known_.size() >> shift != 0; shift += DigitBits) {
         const auto digit = [&](std::size_t i) { return words_[i].number >> shift & (Digits - 1); };
         std::array<std::uint32_t, Digits> places{};
         for (std::size_t i = 0; i < size_; ++i) ++places[digit(i)];
@@ -60,40 +78,26 @@ void FoundWords::sortByDigits() {
     }
 }
 
-/// Puts the words in order, and gets ready to spell them.
+/// Puts the words in order.
 void FoundWords::finish() {
-    if (size_ < FewWords) {
+    if (size_ < FewWords)
         std::ranges::sort(std::span(words_.data(), size_), {}, &FoundWord::number);
-    } else {
+    else
         size_ < ManyWords ? sortByDigits<FewBits>() : sortByDigits<ManyBits>();
-    }
-    std::uint16_t* pair = pairs_.data();
-    for (const char first : board_) {
-        for (const char second : board_) *pair++ = static_cast<std::uint16_t>(first << 8 | second);
-    }
-    hasQu_ = std::find(board_.begin(), board_.end(), 'q') != board_.end();
     isFinished_ = true;
 }
 
-// Words of up to eight letters, nearly all there are, are put together two cubes at a time.
 std::size_t FoundWords::spell(std::size_t i, char* to) {
     if (!isFinished_) finish();
-    const std::size_t letters = words_[i].letters;
-    const std::uint64_t path = words_[i].path << 4 * (LongestWord - letters);
-    const auto four = [&](unsigned shift) {
-        std::uint64_t spelled = 0;
-        for (unsigned pair = 0; pair < 4; ++pair) {
-            spelled = spelled << 16 | pairs_[path >> (shift + 24 - 8 * pair) & 0xff];
-        }
-        return spelled;
-    };
-    WriteLetters(PackedWord{four(32)} << 64 | (letters > 8 ? four(0) : 0), letters, to);
-    for (std::size_t place = 1; hasQu_ && place < letters; ++place) {
-        // A cube twice in a row is the Qu cube.
-        const std::uint64_t both = path >> 4 * (LongestWord - 1 - place) & 0xff;
-        if (both >> 4 == both % 16) to[place] = 'u';
+#if defined(__x86_64__)
+    if (hasAvx2_) return SpellAvx2(words_[i], board_, to);
+#endif
+    std::uint64_t path = words_[i].path;
+    for (std::size_t place = words_[i].letters; place-- > 0; path >>= 4) {
+        const bool isU = place > 0 && (path >> 4) % Cubes == path % Cubes;
+        to[place] = isU ? 'u' : board_[path % Cubes];
     }
-    return letters;
+    return words_[i].letters;
 }
 
 }  // namespace Quorle

@@ -3,7 +3,6 @@
 // for: their order, and their letters.
 #include <vector>
 
-#include "graph/memory.h"
 #include "graph/packed_word.h"
 #include "search/board.h"
 
@@ -24,11 +23,14 @@ class FoundWords {
     }
 
     void clear();
-    /// No words: those that come are of a dictionary of so many, and on a board. Throws
-    /// std::bad_alloc.
-    void begin(std::size_t dictionary, const Board& board);
+    /// No words: those that come are of a dictionary of so many, and on a board. `hasAvx2`: whether
+    /// the processor does. Throws std::bad_alloc.
+    void begin(std::size_t dictionary, const Board& board, bool hasAvx2);
     /// Where so many words can be written behind those there are. Throws std::bad_alloc.
-    FoundWord* room(std::size_t most);
+    FoundWord* room(std::size_t most) {
+        if (words_.size() < size_ + most) words_.resize(2 * size_ + most);
+        return words_.data() + size_;
+    }
     /// Takes in the words written there up to `end` that are new: all of so many letters.
     void take(const FoundWord* end, std::uint32_t letters);
 
@@ -44,13 +46,10 @@ class FoundWords {
     std::vector<FoundWord> words_;  // more than size_
     std::vector<FoundWord> sorted_;
     std::size_t size_ = 0;
-    Memory<std::uint64_t> known_;  // a bit for each word of the dictionary
-    std::size_t knownSize_ = 0;
+    std::vector<std::uint64_t> known_;  // a bit for each word of the dictionary
     Board board_{};
     bool isFinished_ = false;
-    // The letters of each two cubes, the first in the higher byte.
-    std::array<std::uint16_t, std::size_t{Cubes} * Cubes> pairs_;
-    bool hasQu_ = false;
+    bool hasAvx2_ = false;
 };
 
 }  // namespace Quorle

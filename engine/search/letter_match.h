@@ -1,13 +1,6 @@
 #pragma once
-// Which places of a board show one of a set of letters: the one thing that a search does in another
-// way where the processor has wide registers.
-#include <array>
-
+// Which places of a board show one of a set of letters, in the way that suits the processor.
 #include "search/board.h"
-
-#if defined(__x86_64__)
-#include <immintrin.h>
-#endif
 
 namespace Quorle {
 
@@ -35,7 +28,7 @@ class PlainMatch {
     static std::uint32_t wordEnds(Fields edge) { return edge[Mask] >> 31; }
 
   private:
-    std::array<std::array<std::uint32_t, 512>, 4> tables_{};  // the last one of no letter
+    std::array<std::array<std::uint32_t, 512>, 3> tables_{};
 };
 
 #if defined(__x86_64__)
