@@ -7,6 +7,7 @@
 
 #include "engine/calls.h"
 #include "graph/graph_builder.h"
+#include "graph/word_cursor.h"
 #include "support/chains.h"
 
 using namespace Quorle;
@@ -21,6 +22,7 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
     }
     /// Searches, and tries every word.
     void search(const std::string& letters, WordLimits limits) {
+        ASSERT_EQ(graph_.size(), words_.size());
         std::vector<std::string> expected, spelled;
         for (const std::string& word : words_) {
             const auto size = static_cast<int>(word.size());
@@ -46,7 +48,8 @@ class BoardSearchTest : public testing::TestWithParam<Matching> {
 
 // First boards of few letters and words that are everywhere on them: more chains than are ever
 // followed twice. The limits leave words that are never found, the dead end is a word that does
-// not fit.
+// not fit. Then edited graphs, now and then copied without their longest words, or built anew of
+// more words than are stored at once.
 TEST_P(BoardSearchTest, FindsWhatTryingEveryWordFinds) {
     for (std::size_t size = 2; size <= 16; ++size) edit(std::string(size, 'a'));
     for (const char* deadEnd : {"aaaaaaaaaaaaab", "aaaaaaaaaaaaaaab"}) edit(deadEnd);
@@ -63,7 +66,14 @@ TEST_P(BoardSearchTest, FindsWhatTryingEveryWordFinds) {
         const int shortest = 2 + static_cast<int>(random_() % 3);
         const int longest = 2 + static_cast<int>(random_() % 15);
         search(Text(random_, 16, letters), {shortest, longest});
-        if (board % 100 == 0) graph_ = CopyGraph(graph_, 16);
+        const std::size_t most = 16 - board / 100;
+        if (board % 100 == 0) graph_ = CopyGraph(graph_, most);
+        std::erase_if(words_, [most](const std::string& word) { return word.size() > most; });
+        if (board % 100 != 50) continue;
+        GraphBuilder builder(0);
+        WordCursor cursor(graph_);
+        for (auto word = cursor.next(); word != NoWord; word = cursor.next()) builder.add(word);
+        graph_ = builder.finish();
     }
 }
 
