@@ -34,8 +34,8 @@ class FoundWords {
     /// Takes in the words written there up to `end` that are new: all of so many letters.
     void take(const FoundWord* end, std::uint32_t letters);
 
-    /// Once all are in: writes the letters of the word of index `i`, in alphabetical order, and
-    /// returns how many. Throws std::bad_alloc.
+    /// Once all are in: writes the word of index `i`, in alphabetical order, into a buffer of 16
+    /// letters, and returns how many it has. Throws std::bad_alloc.
     std::size_t spell(std::size_t i, char* to);
 
   private:
