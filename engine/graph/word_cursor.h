@@ -24,8 +24,8 @@ class WordCursor {
         size_ = steps_[0].left != 0 ? 1 : 0;
     }
 
-    /// The next word; NoWord at the end, and from then on. Steps are written first and counted
-    /// after, so that the one branch is whether a word ends.
+    /// The next word; NoWord at the end, and from then on. Every way ends with a word. Steps are
+    /// written first and counted after, so that the one branch is whether a word ends.
     PackedWord next() {
         const Edge* const edges = graph_.edges();
         std::size_t size = size_;

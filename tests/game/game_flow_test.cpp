@@ -15,7 +15,6 @@ TEST_F(GameFlow, AWholeGameRunsOutButNotInAPause) {
     clickTiles({0, 1});
     start();  // drops that game
     EXPECT_EQ(times() + text("PlayerWordLabel") + entry(), "Time Remaining 0:15 [] 0");
-    EXPECT_EQ(State.PickedWord, "");
     EXPECT_EQ(text("DefinedWordCount"), "Quorle found 7 words");
     boxes_.expectPause([this] {
         EXPECT_FALSE(isShown("CubeFrame"));
