@@ -36,43 +36,37 @@ inline constexpr auto Around = [] {
 using Fields [[gnu::vector_size(16)]] = std::uint32_t;
 inline constexpr int First = 0, Mask = 1, Before = 2, Free = 3;
 
-/// What a chain that goes on to a place needs to know of it.
-struct Place {
-    std::uint64_t cube;      ///< 0..15
-    std::uint32_t below;     ///< the bits of the letters before its own
-    std::uint32_t touching;  ///< bit i: place i can follow
-    Fields kept;             ///< what a chain keeps of its head
-};
-
+/// What a step to a place needs to know of it: an array each, as indexes then need no arithmetic.
 class BoardPlaces {
   public:
     BoardPlaces() {
         for (std::uint32_t i = 0; i < Places; ++i) {
-            places_[i] = {i % Cubes, 0, Around[i % Cubes], Fields{0, 0, ~0U, ~(1U << i)}};
+            touching[i] = Around[i % Cubes];
+            kept[i] = Fields{0, 0, ~0U, ~(1U << i)};
             setLetter(i, 'u');  // of a place behind the cubes: for good
         }
     }
     void show(const Board& board) {
-        for (std::uint32_t cube = 0; cube < Cubes; ++cube) {
-            setLetter(cube, board[cube]);
-            places_[cube].touching = board[cube] == 'q' ? 1U << (Cubes + cube) : Around[cube];
+        for (std::uint32_t i = 0; i < Cubes; ++i) {
+            setLetter(i, board[i]);
+            touching[i] = board[i] == 'q' ? 1U << (Cubes + i) : Around[i];
         }
     }
-    const Place& operator[](std::size_t place) const { return places_[place]; }
 
+    std::array<Fields, Places> kept;             // what a chain that goes there keeps of its head
+    std::array<std::uint32_t, Places> below;     // the bits of the letters before its own
+    std::array<std::uint32_t, Places> touching;  // bit i: place i can follow
     // The letter of each place, as the bit of a byte of an edge's first eight.
-    alignas(32) std::array<std::uint8_t, Places> byte{};
-    alignas(32) std::array<std::uint8_t, Places> bit{};
+    alignas(32) std::array<std::uint8_t, Places> byte;
+    alignas(32) std::array<std::uint8_t, Places> bit;
 
   private:
     void setLetter(std::uint32_t place, char shown) {
         const auto letter = static_cast<std::uint32_t>(shown - 'a');
-        places_[place].below = (1U << letter) - 1;
+        below[place] = (1U << letter) - 1;
         byte[place] = static_cast<std::uint8_t>(offsetof(Edge, letters) + letter / 8);
         bit[place] = static_cast<std::uint8_t>(1U << letter % 8);
     }
-
-    std::array<Place, Places> places_;
 };
 
 }  // namespace Quorle

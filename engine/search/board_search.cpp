@@ -22,21 +22,26 @@ namespace {
 constexpr std::size_t HardAfter = 16384;
 constexpr int MostEdgesLookedAt = 64;
 
-// What stands behind the edge is read with it, and left out.
-Fields LoadFields(const Edge* edge) {
-    Fields fields;
-    std::memcpy(&fields, edge, sizeof fields);
-    return fields & Fields{~0U, ~0U, ~0U, 0};
+// The next two go without the branch that compilers would make of them: by what the AND tells.
+/// Keeps of `bits` those of `mask`; when that is none, `chain` becomes `otherwise`.
+void Keep(std::uint32_t& bits, std::uint32_t mask, Chain*& chain, Chain* otherwise) {
+#if defined(__x86_64__)
+    asm("and %2, %0\n\tcmovz %3, %1" : "+&r"(bits), "+&r"(chain) : "r"(mask), "r"(otherwise));
+#else
+    if ((bits &= mask) == 0) chain = otherwise;
+#endif
 }
 
-/// One of both, without the branch that compilers would make of it.
-template <class Value>
-Value Choose(std::uint32_t number, Value whenZero, Value otherwise) {
+/// Takes the lowest place from `next`; after the last one, goes on to the chain behind.
+void Advance(const Chain*& at, std::uint32_t& next) {
+    const Chain* const behind = at + 1;
 #if defined(__x86_64__)
-    asm("test %1, %1\n\tcmovz %2, %0" : "+r"(otherwise) : "r"(number), "rm"(whenZero) : "cc");
-    return otherwise;
+    asm("and %2, %0\n\tcmovz %3, %0\n\tcmovz %4, %1"
+        : "+&r"(next), "+&r"(at)
+        : "r"(next - 1), "m"(behind->next), "r"(behind));
 #else
-    return number == 0 ? whenZero : otherwise;
+    next &= next - 1;
+    if (next == 0) next = (at = behind)->next;
 #endif
 }
 
@@ -76,8 +81,8 @@ void BoardSearch::runAvx2([[maybe_unused]] const Edge& root) {
 #endif
 }
 
-// Extends the chain of no letter, which is all of the first level, and what it grows to. Each level
-// begins where the one before ends.
+// Extends the chain of no letter, which is all of the first level, and what it grows to. Between
+// levels one chain is left out: the inner loop reads it, and would wait for one just written.
 template <class Match>
 inline void BoardSearch::run(const Match& match, const Edge& root) {
     const Fields head = {root.first, root.letters, 0, ~0U};
@@ -100,8 +105,8 @@ inline void BoardSearch::run(const Match& match, const Edge& root) {
             isHard = true;
             recent_.clear();
         }
-        Chain* const longer = extend(match, level->end, end, levelEnd, letters + 1);
-        *++level = {levelEnd, longer};
+        Chain* const longer = extend(match, level->end, end, levelEnd + 1, letters + 1);
+        *++level = {levelEnd + 1, longer};
     }
 }
 
@@ -114,24 +119,25 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
     const Edge* const edges = edges_;
     const auto step = [&](const Chain*& at, std::uint32_t& next) {
         const Chain& from = *at;
-        const Place& place = places_[static_cast<std::size_t>(std::countr_zero(next))];
-        const auto before = static_cast<std::size_t>(std::popcount(from.head[Mask] & place.below));
-        const Fields edge = LoadFields(edges + from.head[First] + before);
-        const Fields head = edge + (from.head & place.kept);
-        const std::uint64_t path = from.path << 4 | place.cube;
-        const std::uint32_t follow = match(edge) & place.touching & from.head[Free];
+        const auto place = static_cast<std::size_t>(std::countr_zero(next));
+        const auto before =
+            static_cast<std::size_t>(std::popcount(from.head[Mask] & places_.below[place]));
+        Fields edge;
+        std::memcpy(&edge, edges + from.head[First] + before, sizeof edge);
+        edge &= Fields{~0U, ~0U, ~0U, 0};  // without what stands behind it
+        const Fields head = edge + (from.head & places_.kept[place]);
+        const std::uint64_t path = from.path << 4 | place % Cubes;
+        static_assert(offsetof(FoundWord, number) == Before * sizeof(std::uint32_t));
+        std::memcpy(static_cast<void*>(word), &head, sizeof head);
         word->path = path;
-        word->number = head[Before];
         word += match.wordEnds(edge);
-        to->head = head;
-        to->path = path;
-        to->next = follow;
-        to = Choose(follow, to, to + 1);
+        std::uint32_t follow = match(edge);
+        Chain* after = to + 1;
+        Keep(follow, places_.touching[place] & from.head[Free], after, to);
+        *to = {head, path, follow};
+        to = after;
         __builtin_prefetch(edges + edge[First]);  // comes before the chain's turn
-        next &= next - 1;
-        const std::uint32_t left = next;
-        next = Choose(left, at[1].next, left);
-        at = Choose(left, at + 1, at);
+        Advance(at, next);
     };
     const Chain* const middle = chain + (end - chain) / 2;
     const Chain* other = middle;

@@ -82,8 +82,8 @@ class BoardSearch {
     RecentChains recent_;  // once a board is hard
     std::array<Level, LongestWord + 2> levels_;
     // The chains that wait to be extended, level behind level: a stack, of which each level takes
-    // what one block can grow to. One chain more may be written and not counted.
-    std::array<Chain, (LongestWord + 1) * MostGrown + 1> chains_;
+    // what one block can grow to, and one more. One more still may be written and not counted.
+    std::array<Chain, (LongestWord + 1) * (MostGrown + 1) + 1> chains_;
 };
 
 }  // namespace Quorle

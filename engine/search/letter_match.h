@@ -9,7 +9,7 @@ class PlainMatch {
   public:
     explicit PlainMatch(const BoardPlaces& places) {
         for (std::uint32_t i = 0; i < Places; ++i) {
-            const auto letter = static_cast<std::uint32_t>(std::popcount(places[i].below));
+            const auto letter = static_cast<std::uint32_t>(std::popcount(places.below[i]));
             tables_[letter / 9][1U << letter % 9] |= 1U << i;
         }
         for (auto& table : tables_) {
