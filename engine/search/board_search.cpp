@@ -128,7 +128,7 @@ inline Chain* BoardSearch::extend(const Match& match, const Chain* chain, const 
         const Fields head = edge + (from.head & places_.kept[place]);
         const std::uint64_t path = from.path << 4 | place % Cubes;
         static_assert(offsetof(FoundWord, number) == Before * sizeof(std::uint32_t));
-        std::memcpy(static_cast<void*>(word), &head, sizeof head);
+        std::memcpy(word, &head, sizeof head);
         word->path = path;
         word += match.wordEnds(edge);
         std::uint32_t follow = match(edge);
